@@ -1,0 +1,184 @@
+"""The blackjack table: a quiet drawing on white, under everything that the game lays on it.
+
+The dealer stands at the top, so all arcs have their centre above the picture. The player box
+hides (12, 92)-(120, 176); cards lie from (79, 10) and (79, 217); the strategy button stands on
+the medallion. Nothing is darker than INK_LIMIT allows, so that dark red and black text keeps
+its contrast wherever it falls.
+"""
+
+import math
+
+import shapes
+from lettering import stroke_width, stroked
+from pixels import Canvas
+
+WIDTH, HEIGHT = 240, 268
+# 255 - 226: the darkest step of the paper ramp.
+INK_LIMIT = 29
+
+_ARC_CENTRE = (120, -136)
+_TEXT = "BLACKJACK PAYS 3 TO 2"
+_TEXT_TOP = 204.5
+_TEXT_UNIT = 10 / 6
+_TEXT_GAP = 1.9
+_TEXT_BLANK = 2.6
+_TEXT_STROKE = 0.58
+
+_MEDALLION = (180, 118)
+_TRAYS = ((77, 8, 146, 53), (77, 215, 146, 260))
+
+
+class Paper:
+    """White paper that takes light ink; laying ink twice keeps the darker of the two."""
+
+    def __init__(self):
+        self._ink = [[0.0] * WIDTH for _ in range(HEIGHT)]
+
+    def lay(self, shape, ink, box=(0, 0, WIDTH, HEIGHT)):
+        left, top, right, bottom = box
+        for y in range(max(0, math.floor(top)), min(HEIGHT, math.ceil(bottom))):
+            for x in range(max(0, math.floor(left)), min(WIDTH, math.ceil(right))):
+                covered = shapes.coverage(shape, x, y)
+                self._ink[y][x] = max(self._ink[y][x], ink * covered)
+
+    def lay_placed(self, shape, x, y, half_height, ink):
+        reach = half_height + 1
+        box = (x - reach, y - reach, x + reach, y + reach)
+        self.lay(shapes.placed(shape, x, y, half_height), ink, box)
+
+    def canvas(self):
+        picture = Canvas(WIDTH, HEIGHT)
+        for y, row in enumerate(self._ink):
+            for x, ink in enumerate(row):
+                step = min(INK_LIMIT, round(ink))
+                if step:
+                    picture.put(x, y, f"paper_{255 - step}")
+        return picture
+
+
+def _arc_radius(x, y):
+    return math.hypot(x - _ARC_CENTRE[0], y - _ARC_CENTRE[1])
+
+
+def _arc(inner, outer):
+    """A line across the table, from frame to frame."""
+    within_frame = _notched(6, 18)
+    return lambda x, y: inner <= _arc_radius(x, y) < outer and within_frame(x, y)
+
+
+def _rounded(left, top, right, bottom, radius):
+    """A rectangle with rounded corners."""
+    def inside(x, y):
+        dx = max(left + radius - x, x - (right - radius), 0)
+        dy = max(top + radius - y, y - (bottom - radius), 0)
+        return left <= x < right and top <= y < bottom and dx * dx + dy * dy <= radius * radius
+    return inside
+
+
+def _notched(inset, notch):
+    """The whole picture less an inset, with quarter circles cut out of the corners."""
+    def inside(x, y):
+        dx, dy = min(x, WIDTH - x) - inset, min(y, HEIGHT - y) - inset
+        return dx >= 0 and dy >= 0 and math.hypot(dx, dy) >= notch
+    return inside
+
+
+def _outline(outer, inner):
+    return lambda x, y: outer(x, y) and not inner(x, y)
+
+
+def _lay_inscription(paper):
+    widths = [_TEXT_BLANK if letter == " " else stroke_width(letter) for letter in _TEXT]
+    place = -(sum(widths) + _TEXT_GAP * (len(_TEXT) - 1)) / 2
+    for letter, width in zip(_TEXT, widths):
+        if letter != " ":
+            _lay_letter(paper, letter, place, width)
+        place += width + _TEXT_GAP
+
+
+def _lay_letter(paper, letter, place, width):
+    """Lays one letter on the arc, `place` units along it from the middle of the table."""
+    ink = stroked(letter, _TEXT_STROKE)
+    middle = _TEXT_TOP + 3 * _TEXT_UNIT
+
+    def on_arc(x, y):
+        turn = math.atan2(x - _ARC_CENTRE[0], y - _ARC_CENTRE[1])
+        return ink(turn * middle / _TEXT_UNIT - place,
+                   (_arc_radius(x, y) - _TEXT_TOP) / _TEXT_UNIT)
+
+    turn = (place + width / 2) * _TEXT_UNIT / middle
+    x = _ARC_CENTRE[0] + middle * math.sin(turn)
+    y = _ARC_CENTRE[1] + middle * math.cos(turn)
+    paper.lay(on_arc, INK_LIMIT, (x - 9, y - 10, x + 9, y + 10))
+
+
+def _bare(x, y):
+    """Whether a small suit of the cloth has room at a point."""
+    if _arc_radius(x, y) < 231 and _arc_radius(x, y) > 187:
+        return False
+    if abs(_arc_radius(x, y) - 321) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
+        return False
+    for left, top, right, bottom in _TRAYS:
+        if left - 8 < x < right + 8 and top - 8 < y < bottom + 8:
+            return False
+    return _notched(13, 16)(x, y)
+
+
+def _lay_cloth(paper):
+    """Suits woven into the cloth, hardly seen."""
+    step = 20
+    for row in range(HEIGHT // step + 2):
+        for column in range(WIDTH // (2 * step) + 2):
+            x, y = 2 * step * column + (row % 2) * step, row * step - 6
+            if _bare(x, y):
+                paper.lay_placed(shapes.SUITS[(row + 2 * column) % 4], x, y, 5, 7)
+
+
+def _lay_medallion(paper):
+    x, y = _MEDALLION
+    box = (x - 28, y - 28, x + 28, y + 28)
+    paper.lay(shapes.ring(x, y, 23.5, 25), INK_LIMIT, box)
+    paper.lay(shapes.ring(x, y, 16.5, 17.5), INK_LIMIT, box)
+
+    def edge_marks(px, py):
+        turn = math.atan2(py - y, px - x) / (2 * math.pi) * 8
+        return 17.5 <= math.hypot(px - x, py - y) < 23.5 and abs(turn - round(turn)) < 0.22
+
+    paper.lay(edge_marks, 16, box)
+    paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
+
+
+def _lay_tray(paper, tray):
+    left, top, right, bottom = tray
+    box = (left - 1, top - 1, right + 1, bottom + 1)
+    paper.lay(_outline(_rounded(left, top, right, bottom, 4),
+                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)), INK_LIMIT, box)
+    middle_x, middle_y = (left + right) / 2, (top + bottom) / 2
+    for place, suit in enumerate(shapes.SUITS):
+        paper.lay_placed(suit, middle_x + 15 * (place - 1.5), middle_y, 6, 16)
+
+
+def _lay_frame(paper):
+    paper.lay(_outline(_notched(2, 17), _notched(3, 18)), INK_LIMIT)
+    paper.lay(_outline(_notched(5, 17), _notched(6, 18)), 18)
+    for place, (x, y) in enumerate(((8, 8), (232, 8), (232, 260), (8, 260))):
+        paper.lay_placed(shapes.SUITS[place], x, y, 6, 24)
+
+
+def blackjack_table():
+    paper = Paper()
+    _lay_cloth(paper)
+    for inner, outer, ink in ((195, 196, 18), (197.5, 199, INK_LIMIT),
+                              (220, 221.5, INK_LIMIT), (223, 224, 18),
+                              (319, 320.2, 22), (322, 323, 14)):
+        paper.lay(_arc(inner, outer), ink)
+    _lay_inscription(paper)
+    _lay_medallion(paper)
+    for tray in _TRAYS:
+        _lay_tray(paper, tray)
+    _lay_frame(paper)
+    return paper.canvas()
+
+
+def make_all(output_dir):
+    blackjack_table().save(output_dir / "130_table.png", 256)

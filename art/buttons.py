@@ -1,0 +1,89 @@
+"""Everything that can be pressed or that lights up: one light, one edge, one grey."""
+
+from pathlib import Path
+
+from lettering import BOLD
+from pixels import Canvas, read_grids
+
+_SOURCES = Path(__file__).resolve().parent / "sources" / "pictures"
+_SIGNS = read_grids(_SOURCES / "signs.txt")
+
+
+def raised(width, height):
+    """A raised button with nothing on it, lit from the top left."""
+    button = Canvas(width, height, "grey_40")
+    button.rect(0, 0, width - 1, height - 1, "grey_80")
+    button.rect(1, 1, width - 2, height - 2, "white")
+    button.rect(2, 2, width - 2, height - 2, "button_face")
+    return button
+
+
+def sign(canvas, x, y, name, colour):
+    canvas.text_grid(x, y, _SIGNS[name], {"#": colour})
+
+
+def strategy_button():
+    button = raised(24, 22)
+    sign(button, 7, 4, "question", "card_red")
+    return button
+
+
+def word_button(width, word):
+    button = raised(width, 17)
+    BOLD.write_centred(button, 0, width - 1, 4, word, "red_dark")
+    return button
+
+
+def bet_button(name, live):
+    button = raised(16, 16)
+    if live:
+        sign(button, 4, 4, name, "black")
+    else:
+        sign(button, 5, 5, name, "white")
+        sign(button, 4, 4, name, "grey_80")
+    return button
+
+
+def lamp(name, light, shade):
+    """A square lamp in a raised rim; the sign in it tells right from wrong without its colour."""
+    picture = raised(13, 13)
+    picture.rect(2, 2, 11, 11, shade)
+    picture.rect(3, 3, 11, 11, light)
+    sign(picture, 3, 3, name, "white")
+    return picture
+
+
+def active_mark():
+    mark = Canvas(8, 4, "white")
+    sign(mark, 0, 0, "triangle", "mark_red")
+    return mark
+
+
+def tool_bar():
+    colours = {
+        "K": "ink", "W": "white", "R": "card_red", "r": "red_dark", "G": "lamp_green",
+        "B": "blue", "b": "navy", "L": "grey_d8",
+    }
+    bar = Canvas(80, 15, "nothing")
+    pictures = read_grids(_SOURCES / "tool_bar.txt")
+    for place, name in enumerate(("hit", "stand", "double", "split", "deal")):
+        bar.text_grid(16 * place, 0, pictures[name], colours)
+    return bar
+
+
+def make_all(output_dir):
+    tool_bar().save(output_dir / "128_toolbar.png", 16, transparent="nothing")
+    strategy_button().save(output_dir / "133_strategy.png", 16)
+    active_mark().save(output_dir / "134_active_mark.png", 16)
+    word_button(73, "Insurance").save(output_dir / "139_insurance.png", 16)
+    word_button(55, "Nope").save(output_dir / "143_no_insurance.png", 16)
+    lamp("check", "lamp_green", "green_dark").save(
+        output_dir / "141_lamp_green.png", 16)
+    lamp("cross", "card_red", "red_dark").save(output_dir / "144_lamp_red.png", 16)
+    for number, name, sign_name, live in (
+        (136, "bet_up", "plus", True),
+        (137, "bet_down", "minus", True),
+        (138, "bet_down_off", "minus", False),
+        (139, "bet_up_off", "plus", False),
+    ):
+        bet_button(sign_name, live).save(output_dir / f"icon_{number}_{name}.png", 16)

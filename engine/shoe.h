@@ -1,0 +1,68 @@
+#pragma once
+
+#include <vector>
+
+#include "engine/card.h"
+#include "platform/runtime.h"
+
+namespace feltside {
+
+/// The seed of a shoe's shuffle number nShuffles: that number times day, month, minute, second and
+/// hour. A factor of 0 is left out, lest every shuffle at midnight be the same. Wraps.
+unsigned ShuffleSeed(unsigned nShuffles, const platform::LocalTime& time);
+
+/// One or more decks in one pile, dealt from the front. Games use one of the three sizes below. It
+/// never shuffles by itself: whoever deals decides when.
+class CShoe {
+ public:
+  /// Puts all cards in order, deck after deck, and starts dealing from the front.
+  void Fill();
+
+  /// Fills, then shuffles with a seed from the clock and the number of shuffles so far, so that two
+  /// shuffles within one second differ. Reads the clock of the host.
+  void Shuffle();
+
+  /// Deals the next card. An exhausted shoe gives kNoCard and stays exhausted, as does one that was
+  /// never filled.
+  int TakeCard();
+
+  /// For trying out hands: puts these cards into the last slots and deals them next. The shoe then
+  /// stands so near its end that a deal does not reshuffle it. More cards than the shoe has slots
+  /// change nothing.
+  void StackTop(const std::vector<int>& cards);
+
+  int GetPosition() const { return m_nNext; }  ///< slot of the next card; the count when exhausted
+  int GetCount() const { return m_nCount; }    ///< cards in the full shoe
+  unsigned GetShuffles() const { return m_nShuffles; }  ///< 1 plus the shuffles so far
+
+ protected:
+  explicit CShoe(int decks);
+
+ private:
+  void CheckCards() const;
+
+  std::vector<int> m_nCard;  // m_nCount slots, kNoCard until the first fill
+  int m_nNext = 0;
+  int m_nCount;
+  unsigned m_nShuffles = 1;
+};
+
+/// One deck, in order from the start.
+class CSingleDeck : public CShoe {
+ public:
+  CSingleDeck() : CShoe(1) { Fill(); }
+};
+
+/// Four decks; has no cards before its first fill or shuffle.
+class CFourDeckShoe : public CShoe {
+ public:
+  CFourDeckShoe() : CShoe(4) {}
+};
+
+/// Six decks; has no cards before its first fill or shuffle.
+class CSixDeckShoe : public CShoe {
+ public:
+  CSixDeckShoe() : CShoe(6) {}
+};
+
+}  // namespace feltside

@@ -1,0 +1,53 @@
+#include "platform/frame_window.h"
+
+#include <array>
+#include <utility>
+
+#include "platform/application.h"
+
+namespace platform {
+
+CFrameWindow::CFrameWindow(const std::string& title, std::vector<Accelerator> accelerators)
+    : CTopWindow(title, RectAt({}, CScreen::kSize)), m_arrAccelerators(std::move(accelerators)) {}
+
+Rect CFrameWindow::ViewPlace() {
+  return {0, kBarHeight, CScreen::kSize.width, CScreen::kSize.height};
+}
+
+void CFrameWindow::SetView(std::unique_ptr<CView> view) {
+  m_pView = std::move(view);
+  SetFocus(m_pView.get());
+}
+
+CCommandTarget* CFrameWindow::TargetOf(int commandID, CommandState& state) {
+  const std::array<CCommandTarget*, 3> targets = {m_pView.get(), this, &TheApp()};
+  for (CCommandTarget* target : targets) {
+    state = target->QueryCommand(commandID);
+    if (state != CommandState::kUnknown) return target;
+  }
+  return nullptr;
+}
+
+bool CFrameWindow::IsCommandEnabled(int commandID) {
+  CommandState state = CommandState::kUnknown;
+  return IsEnabled() && TargetOf(commandID, state) != nullptr && state == CommandState::kEnabled;
+}
+
+bool CFrameWindow::ExecuteCommand(int commandID) {
+  if (!IsCommandEnabled(commandID)) return false;
+  CommandState state = CommandState::kUnknown;
+  TargetOf(commandID, state)->RunCommand(commandID);
+  return true;
+}
+
+bool CFrameWindow::OnKeyDown(const KeyStroke& stroke) {
+  for (const Accelerator& accelerator : m_arrAccelerators) {
+    if (accelerator.stroke == stroke) {
+      TheApp().Queue().PostCommand(accelerator.commandID);
+      return true;
+    }
+  }
+  return false;
+}
+
+}  // namespace platform

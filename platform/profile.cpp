@@ -1,0 +1,144 @@
+#include "platform/profile.h"
+
+#include <toml++/toml.h>
+
+#include <fstream>
+#include <iostream>
+#include <limits>
+#include <optional>
+#include <sstream>
+#include <system_error>
+#include <utility>
+
+#include "platform/atomic_file.h"
+
+namespace platform {
+namespace {
+
+namespace fs = std::filesystem;
+
+/// How a reading of the file ended.
+enum class Reading { kRead, kMissing, kUnreadable, kDamaged };
+
+struct ReadProfile {
+  Reading reading = Reading::kMissing;
+  toml::table values;
+};
+
+ReadProfile Read(const fs::path& file) {
+  std::error_code error;
+  if (!fs::exists(file, error)) return {error ? Reading::kUnreadable : Reading::kMissing, {}};
+  if (!fs::is_regular_file(file, error)) return {Reading::kUnreadable, {}};
+  std::ifstream stream(file, std::ios::binary);
+  std::ostringstream text;
+  text << stream.rdbuf();
+  if (!stream) return {fs::file_size(file, error) == 0 ? Reading::kRead : Reading::kUnreadable, {}};
+  try {
+    return {Reading::kRead, toml::parse(text.str())};
+  } catch (const toml::parse_error&) {
+    return {Reading::kDamaged, {}};
+  }
+}
+
+/// A free name beside the file: "name.damaged-1" and so on.
+fs::path NameForDamaged(const fs::path& file) {
+  std::error_code error;
+  fs::path name;
+  int number = 1;
+  do {
+    name = file.string() + ".damaged-" + std::to_string(number++);
+  } while (fs::exists(name, error));
+  return name;
+}
+
+void SetAside(const fs::path& file) {
+  const fs::path kept = NameForDamaged(file);
+  std::error_code error;
+  fs::rename(file, kept, error);
+  if (error) return;
+  std::cerr << "The settings in " << file << " cannot be understood; they are kept as " << kept
+            << " and the defaults hold.\n";
+}
+
+fs::path LockOf(const fs::path& file) {
+  return file.string() + ".lock";
+}
+
+/// Reads under the lock that the caller holds, and sets aside what cannot be understood.
+ReadProfile ReadLocked(const fs::path& file) {
+  ReadProfile profile = Read(file);
+  if (profile.reading == Reading::kDamaged) SetAside(file);
+  return profile;
+}
+
+/// Reads without the lock, as every file that is ever there is a whole one; only a damaged one is
+/// looked at again under the lock, since another game may have replaced it meanwhile.
+ReadProfile ReadUnlocked(const fs::path& file) {
+  ReadProfile profile = Read(file);
+  if (profile.reading != Reading::kDamaged) return profile;
+  const CFileLock lock(LockOf(file));
+  return ReadLocked(file);
+}
+
+/// Keeps a copy of a file in which something other than a section stands where one must be written.
+void KeepCopy(const fs::path& file) {
+  std::error_code error;
+  fs::copy_file(file, NameForDamaged(file), error);
+}
+
+/// Strings as plain quoted ones: in the other forms some line ends do not come back as they were.
+std::string Format(const toml::table& values) {
+  std::ostringstream text;
+  text << toml::toml_formatter(values, toml::format_flags::allow_unicode_strings) << '\n';
+  return text.str();
+}
+
+}  // namespace
+
+CProfile::CProfile(fs::path file) : m_file(std::move(file)) {}
+
+int CProfile::GetInt(const std::string& section, const std::string& entry, int absent) const {
+  const ReadProfile profile = ReadUnlocked(m_file);
+  const auto value = profile.values[section][entry].value_exact<std::int64_t>();
+  const bool fits = value && *value >= std::numeric_limits<int>::min() &&
+                    *value <= std::numeric_limits<int>::max();
+  return fits ? static_cast<int>(*value) : absent;
+}
+
+std::string CProfile::GetString(const std::string& section, const std::string& entry,
+                                const std::string& absent) const {
+  const ReadProfile profile = ReadUnlocked(m_file);
+  return profile.values[section][entry].value_exact<std::string>().value_or(absent);
+}
+
+bool CProfile::WriteInt(const std::string& section, const std::string& entry, int value) const {
+  return Write(section, entry, static_cast<std::int64_t>(value));
+}
+
+bool CProfile::WriteString(const std::string& section, const std::string& entry,
+                           const std::string& value) const {
+  return Write(section, entry, value);
+}
+
+template <class Value>
+bool CProfile::Write(const std::string& section, const std::string& entry,
+                     const Value& value) const {
+  std::error_code error;
+  fs::create_directories(m_file.parent_path(), error);
+  const CFileLock lock(LockOf(m_file));
+  ReadProfile profile = ReadLocked(m_file);
+  bool written = false;
+  if (profile.reading != Reading::kUnreadable) {
+    if (profile.values.contains(section) && !profile.values[section].is_table()) {
+      KeepCopy(m_file);
+      profile.values.erase(section);
+    }
+    profile.values.emplace<toml::table>(section);
+    profile.values[section].as_table()->insert_or_assign(entry, value);
+    written = ReplaceFile(m_file, Format(profile.values));
+  }
+  if (!written) std::cerr << "The setting " << entry << " cannot be kept in " << m_file << ".\n";
+  return written;
+}
+
+}  // namespace platform

@@ -1,0 +1,34 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+namespace platform {
+
+/// The store of the player's choices: integers and strings by section and entry, in one file that
+/// two running games may share.
+///
+/// Every call reads the file anew. A missing file, entry or a value of another type reads as the
+/// default. A file that cannot be understood is set aside under another name and said on the error
+/// stream. A write replaces the file as a whole, so it is either the old one or the new one
+/// whatever happens; where it fails, the old file stays and the error stream says so.
+class CProfile {
+ public:
+  explicit CProfile(std::filesystem::path file);
+
+  int GetInt(const std::string& section, const std::string& entry, int absent) const;
+  std::string GetString(const std::string& section, const std::string& entry,
+                        const std::string& absent) const;
+  /// Answers whether the value is on the disk.
+  bool WriteInt(const std::string& section, const std::string& entry, int value) const;
+  bool WriteString(const std::string& section, const std::string& entry,
+                   const std::string& value) const;
+
+ private:
+  template <class Value>
+  bool Write(const std::string& section, const std::string& entry, const Value& value) const;
+
+  std::filesystem::path m_file;
+};
+
+}  // namespace platform

@@ -1,0 +1,60 @@
+#include "platform/resources.h"
+
+#include <cstdio>
+
+#include "platform/look.h"
+
+namespace platform {
+namespace {
+
+std::string FilePrefix(const std::string& kind, int resourceID) {
+  char number[16];
+  std::snprintf(number, sizeof number, "%03d_", resourceID);
+  return kind + number;
+}
+
+bool StartsWith(std::string_view text, std::string_view prefix) {
+  return text.substr(0, prefix.size()) == prefix;
+}
+
+CBitmap Blank(Size size, int resourceID) {
+  CBitmap blank(size);
+  CSurface surface(blank);
+  surface.Rectangle(surface.Bounds());
+  surface.SetFont({11, false});
+  surface.DrawText(surface.Bounds().Moved({0, size.height / 2 - 5}), std::to_string(resourceID),
+                   TextAlign::kCenter);
+  return blank;
+}
+
+}  // namespace
+
+const CBitmap& CResources::LoadBitmap(int resourceID, Size blank) {
+  return Load("", resourceID, blank);
+}
+
+const CBitmap& CResources::LoadIcon(int resourceID, Size blank) {
+  return Load("icon_", resourceID, blank);
+}
+
+const CBitmap& CResources::Load(const std::string& kind, int resourceID, Size blank) {
+  const std::string prefix = FilePrefix(kind, resourceID);
+  const auto loaded = m_mapLoaded.find(prefix);
+  if (loaded != m_mapLoaded.end()) return loaded->second;
+  std::optional<CBitmap> picture;
+  for (const EmbeddedFile& file : m_files) {
+    if (StartsWith(file.name, prefix)) picture = DecodePicture(file);
+  }
+  return m_mapLoaded.emplace(prefix, picture ? *picture : Blank(blank, resourceID)).first->second;
+}
+
+std::vector<CBitmap> CResources::LoadIconSizes(int resourceID) const {
+  std::vector<CBitmap> sizes;
+  for (const EmbeddedFile& file : m_files) {
+    if (!StartsWith(file.name, FilePrefix("icon_", resourceID))) continue;
+    if (const auto picture = DecodePicture(file)) sizes.push_back(*picture);
+  }
+  return sizes;
+}
+
+}  // namespace platform

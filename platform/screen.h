@@ -1,0 +1,49 @@
+#pragma once
+
+#include <vector>
+
+#include "platform/top_window.h"
+
+namespace platform {
+
+/// The program's window as a stack of top-level windows, the frame at the bottom. It lays their
+/// pixels over one another and hands input to the right one.
+class CScreen {
+ public:
+  /// The whole window's size in pixels.
+  static constexpr Size kSize{240, 294};
+
+  CScreen();
+
+  /// Bottom to top.
+  const std::vector<CTopWindow*>& Windows() const { return m_arrWindows; }
+  CTopWindow* Top() const { return m_arrWindows.empty() ? nullptr : m_arrWindows.back(); }
+  void Push(CTopWindow& window);
+  void Remove(CTopWindow& window);
+
+  void HandleInput(const InputEvent& event);
+  /// Hands the pointer that is down over to another window until it is released.
+  void Capture(CWindow& window) { m_pPressed = &window; }
+
+  /// Something on a top-level window or in the stack has changed.
+  void MarkStale() { m_bStale = true; }
+  void PaintAll();
+  /// Shows the stack if it has changed since it was last shown.
+  void Present();
+  /// What was last shown.
+  const CBitmap& Shown() const { return m_pixels; }
+
+  /// The window is about to be destroyed.
+  void Forget(CWindow& window);
+
+ private:
+  void PressAt(Point at);
+  CTopWindow* WindowUnder(Point at) const;
+
+  std::vector<CTopWindow*> m_arrWindows;
+  CBitmap m_pixels;
+  bool m_bStale = true;
+  CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
+};
+
+}  // namespace platform

@@ -1,0 +1,180 @@
+#include "platform/sdl_host.h"
+
+#include <SDL.h>
+
+#include <cstdlib>
+#include <ctime>
+#include <string_view>
+#include <utility>
+
+#include "platform/help_viewer.h"
+#include "platform/sdl_keys.h"
+#include "platform/sdl_window.h"
+
+namespace platform {
+namespace {
+
+/// SDL's subsystems for as long as the host lives.
+class SdlVideo {
+ public:
+  SdlVideo() : m_bReady(SDL_Init(SDL_INIT_VIDEO) == 0) {}
+  ~SdlVideo() { SDL_Quit(); }
+  SdlVideo(const SdlVideo&) = delete;
+  SdlVideo& operator=(const SdlVideo&) = delete;
+
+  /// Without a display SDL draws into the void and tells nobody.
+  bool HasDisplay() const {
+    if (!m_bReady) return false;
+    const std::string_view driver = SDL_GetCurrentVideoDriver();
+    return driver != "offscreen" && driver != "dummy";
+  }
+
+ private:
+  bool m_bReady;
+};
+
+class SdlHost : public Host {
+ public:
+  SdlHost(std::unique_ptr<SdlVideo> video, Size frameSize)
+      : m_pVideo(std::move(video)), m_window(frameSize) {
+    SDL_StopTextInput();
+  }
+
+  bool IsReady() const { return m_window.IsOpen(); }
+
+  void Show(const CBitmap& frame) override { m_window.Show(frame); }
+  void SetIdentity(const std::string& title, const std::vector<CBitmap>& icons) override {
+    m_window.SetIdentity(title, icons);
+  }
+
+  bool NextEvent(InputEvent& event) override {
+    SDL_Event raw;
+    while (SDL_PollEvent(&raw) != 0) {
+      if (Translate(raw, event)) return true;
+    }
+    return false;
+  }
+
+  void WaitEvent(int milliseconds) override {
+    if (milliseconds < 0) {
+      SDL_WaitEvent(nullptr);
+    } else {
+      SDL_WaitEventTimeout(nullptr, milliseconds);
+    }
+  }
+
+  std::int64_t Ticks() override { return static_cast<std::int64_t>(SDL_GetTicks64()); }
+
+  LocalTime Now() override {
+    const std::time_t now = std::time(nullptr);
+    const std::tm* local = std::localtime(&now);
+    return {local->tm_year + 1900, local->tm_mon + 1, local->tm_mday,
+            local->tm_hour,        local->tm_min,     local->tm_sec};
+  }
+
+  void SetTextInput(bool wanted) override {
+    if (wanted) {
+      SDL_StartTextInput();
+    } else {
+      SDL_StopTextInput();
+    }
+  }
+
+  std::string GetClipboard() override {
+    char* text = SDL_GetClipboardText();
+    std::string copy = text == nullptr ? "" : text;
+    SDL_free(text);
+    return copy;
+  }
+  void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
+
+  void StartHelpViewer(const std::string& commandLine) override {
+    platform::StartHelpViewer(commandLine);
+  }
+
+  std::filesystem::path ProfileFolder() override {
+    const char* configured = std::getenv("XDG_CONFIG_HOME");
+    if (configured != nullptr && configured[0] == '/') return configured;
+    const char* home = std::getenv("HOME");
+    return std::filesystem::path(home == nullptr ? "." : home) / ".config";
+  }
+
+ private:
+  /// Answers whether the event is one for the program; those for the window alone are done here.
+  bool Translate(const SDL_Event& raw, InputEvent& event);
+  bool TranslatePointer(InputKind kind, Uint8 button, int x, int y, InputEvent& event) const;
+  bool TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event);
+
+  std::unique_ptr<SdlVideo> m_pVideo;
+  SdlWindow m_window;
+};
+
+bool SdlHost::Translate(const SDL_Event& raw, InputEvent& event) {
+  event = {};
+  switch (raw.type) {
+    case SDL_QUIT:
+      event.kind = InputKind::kClose;
+      return true;
+    case SDL_WINDOWEVENT:
+      m_window.Refresh();
+      return false;
+    case SDL_MOUSEBUTTONDOWN:
+      return TranslatePointer(InputKind::kPointerDown, raw.button.button, raw.button.x,
+                              raw.button.y, event);
+    case SDL_MOUSEBUTTONUP:
+      return TranslatePointer(InputKind::kPointerUp, raw.button.button, raw.button.x, raw.button.y,
+                              event);
+    case SDL_MOUSEMOTION:
+      return TranslatePointer(InputKind::kPointerMove, SDL_BUTTON_LEFT, raw.motion.x, raw.motion.y,
+                              event);
+    case SDL_MOUSEWHEEL:
+      event.kind = InputKind::kWheel;
+      event.at = m_window.FramePoint(raw.wheel.mouseX, raw.wheel.mouseY);
+      event.wheel = raw.wheel.y;
+      return raw.wheel.y != 0;
+    case SDL_KEYDOWN:
+      return TranslateKey(raw.key, event);
+    case SDL_TEXTINPUT:
+      event.kind = InputKind::kText;
+      event.text = raw.text.text;
+      return true;
+    default:
+      return false;
+  }
+}
+
+bool SdlHost::TranslatePointer(InputKind kind, Uint8 button, int x, int y,
+                               InputEvent& event) const {
+  if (button != SDL_BUTTON_LEFT) return false;
+  event.kind = kind;
+  event.at = m_window.FramePoint(x, y);
+  return true;
+}
+
+bool SdlHost::TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event) {
+  if (key.keysym.sym == SDLK_F11) {
+    if (key.repeat == 0) m_window.ToggleFullScreen();
+    return false;
+  }
+  event.kind = InputKind::kKey;
+  event.stroke = StrokeOf(key.keysym);
+  return event.stroke.key != Key::kNone;
+}
+
+}  // namespace
+
+std::unique_ptr<Host> CreateSdlHost(Size frameSize, std::string& why) {
+  auto video = std::make_unique<SdlVideo>();
+  if (!video->HasDisplay()) {
+    why = "There is no display to show a window on.";
+    return nullptr;
+  }
+  auto host = std::make_unique<SdlHost>(std::move(video), frameSize);
+  if (!host->IsReady()) {
+    why = std::string("The window cannot be opened: ") + SDL_GetError();
+    return nullptr;
+  }
+  return host;
+}
+
+}  // namespace platform

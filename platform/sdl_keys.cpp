@@ -1,0 +1,75 @@
+#include "platform/sdl_keys.h"
+
+#include <cctype>
+
+namespace platform {
+namespace {
+
+struct KeyPair {
+  SDL_Keycode code;
+  Key key;
+};
+
+constexpr KeyPair kKeys[] = {
+    {SDLK_RETURN, Key::kEnter},
+    {SDLK_KP_ENTER, Key::kEnter},
+    {SDLK_ESCAPE, Key::kEscape},
+    {SDLK_TAB, Key::kTab},
+    {SDLK_BACKSPACE, Key::kBackspace},
+    {SDLK_DELETE, Key::kDelete},
+    {SDLK_INSERT, Key::kInsert},
+    {SDLK_UP, Key::kUp},
+    {SDLK_DOWN, Key::kDown},
+    {SDLK_LEFT, Key::kLeft},
+    {SDLK_RIGHT, Key::kRight},
+    {SDLK_HOME, Key::kHome},
+    {SDLK_END, Key::kEnd},
+    {SDLK_PAGEUP, Key::kPageUp},
+    {SDLK_PAGEDOWN, Key::kPageDown},
+    {SDLK_F1, Key::kF1},
+    {SDLK_F4, Key::kF4},
+    {SDLK_F10, Key::kF10},
+};
+
+/// What a key types that is no letter of its own on every keyboard: digits, whichever row or layer
+/// they lie on, and the signs of addition.
+char SignOf(const SDL_Keysym& key) {
+  if (key.sym == SDLK_KP_PLUS || (key.sym == SDLK_EQUALS && (key.mod & KMOD_SHIFT) != 0)) {
+    return '+';
+  }
+  if (key.sym == SDLK_KP_MINUS) return '-';
+  if (key.sym >= SDLK_KP_1 && key.sym <= SDLK_KP_9) {
+    return static_cast<char>('1' + (key.sym - SDLK_KP_1));
+  }
+  const bool letter = key.sym >= SDLK_a && key.sym <= SDLK_z;
+  if (!letter && key.scancode >= SDL_SCANCODE_1 && key.scancode <= SDL_SCANCODE_9) {
+    return static_cast<char>('1' + (key.scancode - SDL_SCANCODE_1));
+  }
+  return 0;
+}
+
+char CharacterOf(const SDL_Keysym& key) {
+  if (const char sign = SignOf(key); sign != 0) return sign;
+  if (key.sym < SDLK_SPACE || key.sym > SDLK_z) return 0;
+  return static_cast<char>(std::toupper(static_cast<int>(key.sym)));
+}
+
+}  // namespace
+
+KeyStroke StrokeOf(const SDL_Keysym& key) {
+  KeyStroke stroke;
+  stroke.ctrl = (key.mod & KMOD_CTRL) != 0;
+  stroke.alt = (key.mod & KMOD_ALT) != 0;
+  stroke.shift = (key.mod & KMOD_SHIFT) != 0;
+  for (const KeyPair& pair : kKeys) {
+    if (pair.code == key.sym) {
+      stroke.key = pair.key;
+      return stroke;
+    }
+  }
+  stroke.character = CharacterOf(key);
+  if (stroke.character != 0) stroke.key = Key::kCharacter;
+  return stroke;
+}
+
+}  // namespace platform

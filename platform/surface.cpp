@@ -1,0 +1,114 @@
+#include "platform/surface.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace platform {
+
+CSurface::CSurface(CBitmap& target) : CSurface(target, target.Bounds()) {}
+
+CSurface::CSurface(CBitmap& target, const Rect& part) : m_pTarget(&target), m_part(part) {}
+
+Font CSurface::SetFont(const Font& font) {
+  return std::exchange(m_state.font, font);
+}
+Color CSurface::SetTextColor(Color color) {
+  return std::exchange(m_state.textColor, color);
+}
+Color CSurface::SetBackColor(Color color) {
+  return std::exchange(m_state.backColor, color);
+}
+BackMode CSurface::SetBackMode(BackMode mode) {
+  return std::exchange(m_state.backMode, mode);
+}
+Color CSurface::SetBrush(Color color) {
+  return std::exchange(m_state.brush, color);
+}
+Color CSurface::SetPen(Color color) {
+  return std::exchange(m_state.pen, color);
+}
+
+/// Calls the rule with each pixel of the rectangle that the target has, and its place on this
+/// surface.
+template <class PixelRule>
+void CSurface::EachPixel(const Rect& rect, PixelRule rule) {
+  const Point origin = m_part.TopLeft();
+  const Rect visible = rect.Moved(origin).Common(m_part).Common(m_pTarget->Bounds());
+  for (int y = visible.top; y < visible.bottom; ++y) {
+    for (int x = visible.left; x < visible.right; ++x) {
+      rule(m_pTarget->At({x, y}), Point{x, y} - origin);
+    }
+  }
+}
+
+void CSurface::FillRect(const Rect& rect, Color color) {
+  const Pixel pixel = ToPixel(color);
+  EachPixel(rect, [pixel](Pixel& target, Point) { target = pixel; });
+}
+
+void CSurface::Rectangle(const Rect& rect) {
+  FillRect(rect, m_state.pen);
+  FillRect(rect.Shrunk(1), m_state.brush);
+}
+
+void CSurface::Line(Point from, Point to) {
+  if (from.y == to.y) {
+    FillRect({std::min(from.x, to.x), from.y, std::max(from.x, to.x), from.y + 1}, m_state.pen);
+  } else {
+    FillRect({from.x, std::min(from.y, to.y), from.x + 1, std::max(from.y, to.y)}, m_state.pen);
+  }
+}
+
+void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt, RasterOp op) {
+  const Point shift = sourceAt - at;
+  EachPixel(RectAt(at, size), [&](Pixel& target, Point p) {
+    if (!source.Bounds().Contains(p + shift)) return;
+    const Pixel pixel = source.At(p + shift) | 0xFF000000U;
+    target = op == RasterOp::kAnd ? target & pixel : pixel;
+  });
+}
+
+void CSurface::StretchBlt(const Rect& to, const CBitmap& source, const Rect& from) {
+  if (to.IsEmpty()) return;
+  EachPixel(to, [&](Pixel& target, Point p) {
+    const Point sample{from.left + (p.x - to.left) * from.Width() / to.Width(),
+                       from.top + (p.y - to.top) * from.Height() / to.Height()};
+    if (source.Bounds().Contains(sample)) target = source.At(sample) | 0xFF000000U;
+  });
+}
+
+void CSurface::DrawIcon(Point at, const CBitmap& icon) {
+  EachPixel(RectAt(at, icon.GetSize()), [&](Pixel& target, Point p) {
+    const Pixel pixel = icon.At(p - at);
+    if (IsOpaque(pixel)) target = pixel;
+  });
+}
+
+void CSurface::DrawStencil(Point at, const CBitmap& stencil, Color color) {
+  EachPixel(RectAt(at, stencil.GetSize()), [&](Pixel& target, Point p) {
+    if (IsOpaque(stencil.At(p - at))) target = ToPixel(color);
+  });
+}
+
+Size CSurface::TextExtent(const std::string& text) const {
+  return MeasureText(m_state.font, text);
+}
+
+void CSurface::TextOut(Point at, const std::string& text) {
+  const CBitmap stencil = RenderText(m_state.font, text);
+  if (m_state.backMode == BackMode::kOpaque) {
+    FillRect(RectAt(at, stencil.GetSize()), m_state.backColor);
+  }
+  DrawStencil(at, stencil, m_state.textColor);
+}
+
+void CSurface::DrawText(const Rect& rect, const std::string& text, TextAlign align) {
+  const int spare = rect.Width() - TextExtent(text).width;
+  const int indent = align == TextAlign::kLeft ? 0 : align == TextAlign::kRight ? spare : spare / 2;
+  CSurface line(*m_pTarget, rect.Moved(m_part.TopLeft()).Common(m_part));
+  line.m_state = m_state;
+  line.TextOut(Point{rect.left + indent, rect.top} + m_part.TopLeft() - line.m_part.TopLeft(),
+               text);
+}
+
+}  // namespace platform

@@ -1,0 +1,87 @@
+// What every drawing of the table is put together from: cards, labels, hand texts and pictures.
+
+#include "platform/application.h"
+#include "render/table_layout.h"
+
+namespace feltside {
+namespace {
+
+constexpr platform::Font kHandFont{11, false};
+constexpr platform::Font kHandFontBold{11, true};
+constexpr platform::Font kMessageFont{14, true};
+constexpr platform::Color kHandTextColor = platform::Rgb(200, 0, 0);
+constexpr int kTextGap = 10;  ///< between a fan and the text beside it
+
+/// Text without a cell of its own, as whatever lies beneath is to show through.
+void TextOnTable(platform::CSurface& surface, platform::Point at, const std::string& text,
+                 platform::Color table) {
+  surface.SetBackColor(table);
+  surface.SetBackMode(platform::BackMode::kTransparent);
+  surface.TextOut(at, text);
+  surface.SetBackMode(platform::BackMode::kOpaque);
+}
+
+}  // namespace
+
+using platform::Point;
+using platform::Size;
+
+void CTableLayout::DrawCard(int position, int slot, int bitmapID) const {
+  if (position == -1 || slot == -1 || bitmapID < 1 || bitmapID > kLastCardBackID) return;
+  const Size card{m_nCardWidth, m_nCardHeight};
+  const platform::CBitmap& picture = platform::TheApp().Resources().LoadBitmap(bitmapID, card);
+  m_pDC->StretchBlt(RectAt(CardCorner(position, slot), card), picture, RectAt({}, card));
+}
+
+void CTableLayout::DrawHand(int position, CCardHand hand) const {
+  for (int slot = 0; slot < hand.GetCount(); ++slot) {
+    DrawCard(position, slot, hand.GetCard(slot));
+  }
+}
+
+void CTableLayout::DrawLabel(int position, const std::string& text) const {
+  const platform::Font previous = m_pDC->SetFont(kHandFont);
+  const Size extent = m_pDC->TextExtent(text);
+  Point at = CardCorner(position, 0);
+  at.x -= extent.width + kTextGap;
+  const bool atTop = position == POS_TOP || position == POS_TOP_LEFT || position == POS_TOP_RIGHT;
+  if (!atTop) at.y += m_nCardHeight - extent.height;
+  TextOnTable(*m_pDC, at, text, m_crTable);
+  m_pDC->SetFont(previous);
+}
+
+Point CTableLayout::HandTextPos(int position, int textHeight) const {
+  switch (position) {
+    case POS_ABOVE_BOTTOM:
+      return CardCorner(POS_BOTTOM, 0) - Point{0, textHeight + 8};
+    case POS_ABOVE_BOTTOM_LEFT:
+      return CardCorner(POS_BOTTOM_LEFT, 0) - Point{0, textHeight + 5};
+    case POS_ABOVE_BOTTOM_RIGHT:
+      return CardCorner(POS_BOTTOM_RIGHT, 0) - Point{0, textHeight + 5};
+    case POS_TOP:
+    case POS_TOP_LEFT:
+    case POS_TOP_RIGHT:
+      return CardCorner(position, m_nFanCards - 1) + Point{m_nCardWidth + kTextGap, 0};
+    default:
+      return CardCorner(position, m_nFanCards - 1) +
+             Point{m_nCardWidth + kTextGap, m_nCardHeight - textHeight};
+  }
+}
+
+void CTableLayout::DrawHandText(int position, const std::string& text, bool bold) const {
+  const platform::Font previous = m_pDC->SetFont(bold ? kHandFontBold : kHandFont);
+  const platform::Color previousColor = m_pDC->SetTextColor(kHandTextColor);
+  const Point at = HandTextPos(position, m_pDC->TextExtent(text).height);
+  // The message of the whole deal is larger than the others, but stands as if it were not.
+  if (position == POS_ABOVE_BOTTOM) m_pDC->SetFont(kMessageFont);
+  TextOnTable(*m_pDC, at, text, m_crTable);
+  m_pDC->SetFont(previous);
+  m_pDC->SetTextColor(previousColor);
+}
+
+void CTableLayout::CopyPicture(Point at, Size size, int bitmapID, platform::RasterOp op) const {
+  const platform::CBitmap& picture = platform::TheApp().Resources().LoadBitmap(bitmapID, size);
+  m_pDC->BitBlt(at, size, picture, {}, op);
+}
+
+}  // namespace feltside

@@ -1,0 +1,73 @@
+// How a frame is put together: the title until the first deal, then the table, composed off screen
+// and shown in one transfer.
+
+#include "platform/application.h"
+#include "table/feltside_view.h"
+
+namespace feltside {
+namespace {
+
+/// Loads a picture into a pointer that has none yet.
+void LoadOnce(std::unique_ptr<platform::CBitmap>& picture, int bitmapID, platform::Size size) {
+  if (picture != nullptr) return;
+  picture = std::make_unique<platform::CBitmap>(
+      platform::TheApp().Resources().LoadBitmap(bitmapID, size));
+}
+
+}  // namespace
+
+using platform::CSurface;
+using platform::Rect;
+
+/// The paint covers every pixel itself, so nothing is to be cleared before it.
+bool CFeltsideView::OnEraseBkgnd(CSurface&) {
+  return true;
+}
+
+void CFeltsideView::OnDraw(CSurface& surface) {
+  if (m_bShowTitle != 0) {
+    DrawTitle(surface);
+  } else {
+    DrawTable(surface);
+  }
+}
+
+void CFeltsideView::DrawTitle(CSurface& surface) {
+  LoadTitleBitmap();
+  const Rect client = GetClientRect();
+  surface.FillRect(client, platform::kWhite);
+  surface.BitBlt({client.Width() / 2 - kTitlePicture.width / 2,
+                  client.Height() / 2 - kTitlePicture.height / 2},
+                 kTitlePicture, *m_pTitleBitmap);
+}
+
+void CFeltsideView::DrawTable(CSurface& surface) {
+  LoadTableBitmap();
+  const Rect client = GetClientRect();
+  const platform::Size size{client.Width(), client.Height()};
+  platform::CBitmap pixels(size);
+  CSurface frame(pixels);
+  frame.FillRect(client, m_layout.m_crTable);
+  if (m_bFancyBlackjack != 0) frame.BitBlt({}, kTablePicture, *m_pTableBitmap);
+  m_layout.Prepare(frame, client);
+  if (m_nGameType == kGameBlackjack) {
+    DrawBlackjackTable();
+  } else if (m_nGameType == kGameVideoPoker) {
+    DrawVideoPokerTable(frame);
+  }
+  surface.BitBlt(client.TopLeft(), size, pixels);
+}
+
+void CFeltsideView::LoadTitleBitmap() {
+  if (m_bShowTitle != 0) LoadOnce(m_pTitleBitmap, IDB_TITLE, kTitlePicture);
+}
+
+void CFeltsideView::LoadTableBitmap() {
+  LoadOnce(m_pTableBitmap, IDB_TABLE, kTablePicture);
+}
+
+void CFeltsideView::LoadPokerBitmap() {
+  LoadOnce(m_pPokerBitmap, IDB_POKER_TABLE, kPokerPicture);
+}
+
+}  // namespace feltside

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "platform/geometry.h"
+
+namespace feltside {
+
+// Numbers of the pictures that the table is drawn from. Card faces have their card's number, 1..52.
+
+inline constexpr int kFirstCardBackID = 54;
+inline constexpr int kLastCardBackID = 65;
+
+inline constexpr int IDB_TABLE = 130;
+inline constexpr int IDB_STRATEGY = 133;
+inline constexpr int IDB_ACTIVE_MARK = 134;
+inline constexpr int IDB_INSURANCE = 139;
+inline constexpr int IDB_TITLE = 140;
+inline constexpr int IDB_LAMP_GREEN = 141;
+inline constexpr int IDB_POKER_TABLE = 142;
+inline constexpr int IDB_NO_INSURANCE = 143;
+inline constexpr int IDB_LAMP_RED = 144;
+
+inline constexpr int IDI_BET_UP = 136;
+inline constexpr int IDI_BET_DOWN = 137;
+inline constexpr int IDI_BET_DOWN_OFF = 138;
+inline constexpr int IDI_BET_UP_OFF = 139;
+
+// Sizes in pixels.
+inline constexpr platform::Size kTablePicture{240, 268};
+inline constexpr platform::Size kPokerPicture{240, 270};
+inline constexpr platform::Size kTitlePicture{96, 116};
+
+}  // namespace feltside

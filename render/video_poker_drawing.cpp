@@ -1,0 +1,91 @@
+// What only the plain video-poker table shows.
+
+#include <array>
+
+#include "engine/poker.h"
+#include "render/table_layout.h"
+
+namespace feltside {
+namespace {
+
+constexpr platform::Font kPayFont{11, false};
+constexpr platform::Font kButtonFont{22, false};
+constexpr platform::Color kButtonColor = platform::Rgb(0, 100, 255);
+constexpr platform::Color kAmountColor = platform::Rgb(91, 152, 139);
+/// The widest number of the pay table gives its columns their width and its rows their height.
+constexpr char kWidestNumber[] = "888";
+
+/// The categories of a row of the pay table, left and right.
+struct PayRow {
+  PokerCategory left;
+  PokerCategory right;
+};
+constexpr std::array<PayRow, 4> kPayRows = {{{POKER_ROYAL_FLUSH, POKER_FLUSH},
+                                             {POKER_STRAIGHT_FLUSH, POKER_STRAIGHT},
+                                             {POKER_FOUR_OF_A_KIND, POKER_THREE_OF_A_KIND},
+                                             {POKER_FULL_HOUSE, POKER_TWO_PAIR}}};
+
+}  // namespace
+
+using platform::Point;
+using platform::Rect;
+
+void CTableLayout::DrawPayTable() const {
+  const platform::SavedState saved(*m_pDC);
+  const int bottom = CardCorner(POS_MIDDLE_ROW, 0).y - 5;
+  m_pDC->SetFont(kPayFont);
+  const platform::Size number = m_pDC->TextExtent(kWidestNumber);
+  m_pDC->SetBrush(platform::kWhite);
+  m_pDC->SetBackColor(platform::kWhite);
+  m_pDC->SetPen(platform::kBlack);
+  m_pDC->Rectangle({m_rcTable.left + 2, m_rcTable.top + 2, m_rcTable.right - 2, bottom});
+  m_pDC->Line({Center().x, 0}, {Center().x, bottom});
+  for (int row = 0; row < static_cast<int>(kPayRows.size()); ++row) {
+    DrawPayRow(row, number.height + 1, number.width);
+  }
+}
+
+void CTableLayout::DrawPayRow(int row, int rowHeight, int numberWidth) const {
+  const PayRow& categories = kPayRows[static_cast<std::size_t>(row)];
+  const PokerReturn& left = kPokerReturns[static_cast<std::size_t>(categories.left)];
+  const PokerReturn& right = kPokerReturns[static_cast<std::size_t>(categories.right)];
+  const int y = m_rcTable.top + 2 + 3 + row * rowHeight;
+  m_pDC->TextOut({m_rcTable.left + 2 + 3, y}, left.name);
+  m_pDC->TextOut({Center().x - numberWidth - 3, y}, std::to_string(left.dollars));
+  m_pDC->TextOut({Center().x + 3, y}, right.name);
+  m_pDC->TextOut({m_rcTable.right - 3 - numberWidth, y}, std::to_string(right.dollars));
+}
+
+Rect CTableLayout::PlayButtonRect() const {
+  const int top = CardCorner(POS_MIDDLE_ROW, 0).y + m_nCardHeight + 10;
+  return {Center().x - 30, top, Center().x + 30, top + 40};
+}
+
+void CTableLayout::DrawPlayButton(bool deal) const {
+  const platform::SavedState saved(*m_pDC);
+  const std::string text = deal ? "Deal" : "Play";
+  const Rect button = PlayButtonRect();
+  m_pDC->SetFont(kButtonFont);
+  const platform::Size extent = m_pDC->TextExtent(text);
+  m_pDC->SetBrush(kButtonColor);
+  m_pDC->SetBackColor(kButtonColor);
+  m_pDC->SetPen(platform::kBlack);
+  m_pDC->Rectangle(button);
+  m_pDC->TextOut({(button.left + button.right) / 2 - extent.width / 2,
+                  (button.top + button.bottom) / 2 - extent.height / 2},
+                 text);
+}
+
+void CTableLayout::DrawAmount(int position, int dollars) const {
+  const platform::SavedState saved(*m_pDC);
+  m_pDC->SetFont(kPayFont);
+  m_pDC->SetTextColor(kAmountColor);
+  std::string text = std::to_string(dollars);
+  text.insert(text.begin(), '$');
+  const platform::Size extent = m_pDC->TextExtent(text);
+  m_pDC->SetBackMode(platform::BackMode::kTransparent);
+  const Point at = CardCorner(position, 0);
+  m_pDC->TextOut({at.x - extent.width - 10, at.y - 2 * extent.height - 3 + m_nCardHeight}, text);
+}
+
+}  // namespace feltside

@@ -1,0 +1,53 @@
+#include "shell/feltside_app.h"
+
+#include <array>
+#include <memory>
+
+#include "platform/document_template.h"
+#include "platform/host.h"
+#include "shell/feltside_doc.h"
+#include "shell/main_frame.h"
+#include "shell/res/frame_resources.h"
+#include "shell/res/pictures.h"
+#include "table/feltside_view.h"
+
+namespace feltside {
+
+struct CFeltsideApp::Commands {
+  using App = CFeltsideApp;
+  /// There is no file to open on this system: to open is to start with a new document.
+  static constexpr std::array<platform::CommandEntry<App>, 2> kMap = {{
+      {platform::kCommandNew, &App::OnNew},
+      {platform::kCommandOpen, &App::OnNew},
+  }};
+};
+
+CFeltsideApp::CFeltsideApp() : CApplication("Feltside", PictureFiles()) {}
+
+platform::CommandState CFeltsideApp::QueryCommand(int commandID) const {
+  return QueryCommandMap(*this, Commands::kMap, commandID);
+}
+
+void CFeltsideApp::RunCommand(int commandID) {
+  RunCommandMap(*this, Commands::kMap, commandID);
+}
+
+bool CFeltsideApp::InitInstance() {
+  SetRegistryKey("Quillworks");
+  platform::CSingleDocTemplate::Makers makers;
+  makers.document = [] { return std::make_unique<CFeltsideDoc>(); };
+  makers.frame = [](const std::string& title) { return std::make_unique<CMainFrame>(title); };
+  makers.view = [](platform::CFrameWindow& frame) {
+    return std::make_unique<CFeltsideView>(frame);
+  };
+  AddDocTemplate(std::make_unique<platform::CSingleDocTemplate>(kDocumentString, makers));
+  if (!OpenNewDocument()) return false;
+  ShowMainWindow(IDR_MAINFRAME);
+  return true;
+}
+
+void CFeltsideApp::OnNew() {
+  OpenNewDocument();
+}
+
+}  // namespace feltside

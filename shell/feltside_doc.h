@@ -1,0 +1,10 @@
+#pragma once
+
+#include "platform/document_template.h"
+
+namespace feltside {
+
+/// The document of the program. It holds nothing: the view has the whole state of the game.
+class CFeltsideDoc : public platform::CDocument {};
+
+}  // namespace feltside

@@ -1,0 +1,22 @@
+#include <cstdlib>
+#include <iostream>
+
+#include "platform/screen.h"
+#include "platform/sdl_host.h"
+#include "shell/feltside_app.h"
+
+namespace {
+/// Tells a caller that nothing but a display was missing.
+constexpr int kExitNoDisplay = 3;
+}  // namespace
+
+int main(int, char**) {
+  std::string why;
+  const auto host = platform::CreateSdlHost(platform::CScreen::kSize, why);
+  if (host == nullptr) {
+    std::cerr << "Feltside: " << why << '\n';
+    return kExitNoDisplay;
+  }
+  platform::SetHost(host.get());
+  return feltside::CFeltsideApp().Main();
+}

@@ -1,0 +1,21 @@
+#pragma once
+
+#include "platform/command_bar.h"
+#include "platform/frame_window.h"
+
+namespace feltside {
+
+/// The program's window: the command bar with menu and tool bar above the table.
+class CMainFrame : public platform::CFrameWindow {
+ public:
+  explicit CMainFrame(const std::string& title);
+
+  int OnCreate() override;
+  void RefreshCommandStates() override { m_wndCommandBar.RefreshStates(); }
+  bool OnKeyDown(const platform::KeyStroke& stroke) override;
+
+ private:
+  platform::CCommandBar m_wndCommandBar;
+};
+
+}  // namespace feltside

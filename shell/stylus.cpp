@@ -1,0 +1,239 @@
+#include "shell/stylus.h"
+
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdio>
+#include <cstdlib>
+#include <sstream>
+
+#include "shell/table_state.h"
+#include "table/command_ids.h"
+
+namespace feltside {
+namespace {
+
+constexpr std::size_t kAnyNumber = static_cast<std::size_t>(-1);
+
+constexpr std::array kShownCommands = {
+    kCommandHit,        kCommandStand,         kCommandDoubleDown,
+    kCommandSplit,      kCommandDeal,          kCommandGameSetup,
+    kCommandTableSetup, kCommandHighScores,    platform::kCommandAbout,
+    kCommandHelp,       platform::kCommandExit};
+
+int ToInt(const std::string& word) {
+  int value = 0;
+  const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
+  if (error != std::errc{} || end != word.data() + word.size()) {
+    throw std::string("not a whole number: " + word);
+  }
+  return value;
+}
+
+double ToMoney(const std::string& word) {
+  char* end = nullptr;
+  const double value = std::strtod(word.c_str(), &end);
+  if (end == word.c_str() || *end != '\0' || !std::isfinite(value)) {
+    throw std::string("no amount of money: " + word);
+  }
+  return value;
+}
+
+bool IsLeapYear(int year) {
+  return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
+}
+
+bool IsDate(const platform::LocalTime& t) {
+  if (t.month < 1 || t.month > 12) return false;
+  constexpr std::array<int, 12> kDays = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+  const int leapDay = t.month == 2 && IsLeapYear(t.year) ? 1 : 0;
+  return t.day >= 1 && t.day <= kDays[static_cast<std::size_t>(t.month - 1)] + leapDay &&
+         t.hour >= 0 && t.hour <= 23 && t.minute >= 0 && t.minute <= 59 && t.second >= 0 &&
+         t.second <= 59;
+}
+
+CFeltsideView& View() {
+  return static_cast<CFeltsideView&>(platform::TheApp().MainFrame()->View());
+}
+
+}  // namespace
+
+const std::vector<CStylus::Command>& CStylus::Commands() {
+  static const std::vector<Command> commands = {
+      {"tap", 2, 2, &CStylus::Tap},
+      {"touch", 2, 2, &CStylus::Touch},
+      {"command", 1, 1, &CStylus::ChooseCommand},
+      {"key", 1, 1, &CStylus::PressKey},
+      {"type", 1, kAnyNumber, &CStylus::Type},
+      {"clock", 1, 1, &CStylus::SetClock},
+      {"stack", 1, kAnyNumber, &CStylus::Stack},
+      {"wallet", 1, 1, &CStylus::SetWallet},
+      {"shot", 1, 1, &CStylus::Shot},
+      {"state", 0, 0, &CStylus::ShowState},
+      {"close", 0, 0, &CStylus::Close},
+  };
+  return commands;
+}
+
+CStylus::CStylus(platform::OffscreenHost& host, CFeltsideApp& app, std::istream& in,
+                 std::ostream& out)
+    : m_host(host), m_app(app), m_in(in), m_out(out) {
+  m_host.SetIdleHandler([this] { return OnIdle(); });
+}
+
+int CStylus::Run() {
+  const int exitCode = m_app.Main();
+  if (m_bAnswerDue) {
+    Json state = State();
+    state["running"] = false;
+    state["exit"] = exitCode;
+    m_out << state.dump() << std::endl;
+  }
+  return exitCode;
+}
+
+bool CStylus::OnIdle() {
+  if (m_bAnswerDue) {
+    m_bAnswerDue = false;
+    Json answer = m_bWithState ? State() : Json::object();
+    answer.update(m_answer);
+    m_out << answer.dump() << std::endl;
+  }
+  std::string line;
+  do {
+    if (!std::getline(m_in, line)) return false;
+  } while (line.empty() || line[0] == '#');
+  Interpret(line);
+  return true;
+}
+
+void CStylus::Interpret(const std::string& line) {
+  m_bAnswerDue = true;
+  m_bWithState = true;
+  m_answer = Json::object();
+  std::istringstream stream(line);
+  Words words;
+  for (std::string word; stream >> word;) words.push_back(word);
+  try {
+    for (const Command& command : Commands()) {
+      if (words.empty() || words[0] != command.name) continue;
+      const std::size_t following = words.size() - 1;
+      if (following < command.fewest || following > command.most) {
+        throw std::string("wrong number of words: " + line);
+      }
+      // A text is taken as it stands, blanks and all.
+      words[0] = line;
+      return (this->*command.run)(words);
+    }
+    throw std::string("unknown command: " + line);
+  } catch (const std::string& what) {
+    m_bWithState = false;
+    m_answer["error"] = what;
+  }
+}
+
+CStylus::Json CStylus::State() {
+  Json state = CTableState(View()).Read();
+  state["enabled"] = EnabledCommands();
+  state["windows"] = Json::array();
+  for (const platform::CTopWindow* window : m_app.Screen().Windows()) {
+    state["windows"].push_back(window->GetTitle());
+  }
+  state["helps"] = m_host.HelpCalls();
+  state["running"] = true;
+  return state;
+}
+
+CStylus::Json CStylus::EnabledCommands() const {
+  Json enabled = Json::object();
+  for (const int commandID : kShownCommands) {
+    enabled[std::to_string(commandID)] = m_app.MainFrame()->IsCommandEnabled(commandID);
+  }
+  return enabled;
+}
+
+void CStylus::PutTap(platform::Point at) {
+  platform::InputEvent event;
+  event.at = at;
+  event.kind = platform::InputKind::kPointerDown;
+  m_host.PutInput(event);
+  event.kind = platform::InputKind::kPointerUp;
+  m_host.PutInput(event);
+}
+
+void CStylus::Tap(const Words& words) {
+  const platform::Point p{ToInt(words[1]), ToInt(words[2])};
+  if (View().GetClientRect().Contains(p)) PutTap(p + View().ScreenOrigin());
+}
+
+void CStylus::Touch(const Words& words) {
+  const platform::Point p{ToInt(words[1]), ToInt(words[2])};
+  if (RectAt({}, platform::CScreen::kSize).Contains(p)) PutTap(p);
+}
+
+void CStylus::ChooseCommand(const Words& words) {
+  const int commandID = ToInt(words[1]);
+  platform::CTopWindow* top = m_app.Screen().Top();
+  if (top->GetKind() == platform::CTopWindow::Kind::kPopup) top->OnPressOutside();
+  if (m_app.MainFrame()->IsCommandEnabled(commandID)) {
+    m_app.Queue().PostCommand(commandID);
+  } else {
+    m_answer["refused"] = true;
+  }
+}
+
+void CStylus::PressKey(const Words& words) {
+  const auto stroke = platform::ParseChord(words[1]);
+  if (!stroke) throw std::string("no such key: " + words[1]);
+  platform::InputEvent event;
+  event.kind = platform::InputKind::kKey;
+  event.stroke = *stroke;
+  m_host.PutInput(event);
+}
+
+void CStylus::Type(const Words& words) {
+  platform::InputEvent event;
+  event.kind = platform::InputKind::kText;
+  event.text = words[0].substr(words[0].find("type") + 5);
+  m_host.PutInput(event);
+}
+
+void CStylus::SetClock(const Words& words) {
+  platform::LocalTime t{};
+  int length = 0;
+  const std::string& text = words[1];
+  const int read = std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d%n", &t.year, &t.month, &t.day,
+                               &t.hour, &t.minute, &t.second, &length);
+  constexpr int kTextLength = 19;
+  if (read != 6 || length != kTextLength || text.size() != kTextLength || !IsDate(t)) {
+    throw std::string("no date and time: " + text);
+  }
+  m_host.SetClock(t);
+}
+
+void CStylus::Stack(const Words& words) {
+  std::vector<int> cards;
+  for (std::size_t i = 1; i < words.size(); ++i) cards.push_back(ToInt(words[i]));
+  const std::string wrong = CTableState(View()).Stack(cards);
+  if (!wrong.empty()) throw wrong;
+}
+
+void CStylus::SetWallet(const Words& words) {
+  CTableState(View()).SetWallet(ToMoney(words[1]));
+  View().Invalidate();
+}
+
+void CStylus::Shot(const Words& words) {
+  m_bWithState = false;
+  if (!platform::SavePng(m_app.Screen().Shown(), words[1])) {
+    throw std::string("cannot write " + words[1]);
+  }
+}
+
+void CStylus::Close(const Words&) {
+  platform::InputEvent event;
+  event.kind = platform::InputKind::kClose;
+  m_host.PutInput(event);
+}
+
+}  // namespace feltside

@@ -1,0 +1,89 @@
+// The dealer's play and the settlement that follows.
+
+#include <vector>
+
+#include "platform/application.h"
+#include "platform/runtime.h"
+#include "table/command_ids.h"
+#include "table/feltside_view.h"
+
+namespace feltside {
+namespace {
+
+constexpr int kDealerStands = 17;
+constexpr int kDealerCards = 5;  ///< the dealer draws no sixth card
+constexpr int kTwentyOne = 21;
+
+bool IsPlayCommand(const platform::Message& message) {
+  if (message.kind != platform::MessageKind::kCommand) return false;
+  return message.commandID == kCommandHit || message.commandID == kCommandStand ||
+         message.commandID == kCommandDoubleDown || message.commandID == kCommandSplit;
+}
+
+/// Whether a message asks to leave the program: that has to wait until the deal is settled.
+bool AsksToLeave(const platform::Message& message) {
+  return message.kind == platform::MessageKind::kClose ||
+         message.kind == platform::MessageKind::kQuit ||
+         (message.kind == platform::MessageKind::kCommand &&
+          message.commandID == platform::kCommandExit);
+}
+
+}  // namespace
+
+void CFeltsideView::DealerPlay() {
+  m_bHandInProgress = 0;
+  m_strDealerScore = std::to_string(m_handDealer.GetTotal());
+  PumpMessages();
+  while (m_handDealer.GetTotal() < kDealerStands && m_handDealer.GetCount() < kDealerCards) {
+    m_handDealer.AddCard(NextCard());
+    m_strDealerScore = std::to_string(m_handDealer.GetTotal());
+    Repaint();
+    if (m_handDealer.GetTotal() < kDealerStands) platform::Sleep(m_nDealerDelay);
+  }
+  Settle();
+}
+
+/// Handles what was already waiting when the dealer began. None of it may touch the deal being
+/// settled: play commands are dropped, and the disabled frame refuses taps, keys and all other
+/// commands.
+void CFeltsideView::PumpMessages() {
+  platform::CApplication& app = platform::TheApp();
+  TopLevel().EnableWindow(false);
+  std::vector<platform::Message> leaving;
+  platform::Message message;
+  while (app.Queue().Peek(message)) {
+    if (AsksToLeave(message)) {
+      leaving.push_back(message);
+    } else if (!IsPlayCommand(message)) {
+      app.Dispatch(message);
+    }
+  }
+  for (const platform::Message& waiting : leaving) app.Queue().Post(waiting);
+  TopLevel().EnableWindow(true);
+}
+
+void CFeltsideView::Settle() {
+  m_bHandInProgress = 0;
+  const bool natural =
+      m_handPlayer.GetTotal() == kTwentyOne && m_handPlayer.GetCount() == 2 && !IsSplit();
+  if (natural) {
+    m_dWallet += 1.5 * m_nBet;
+  } else {
+    m_strPlayerMsg = SettleHand(m_handPlayer, m_bDoubledPlayer != 0 ? 2 * m_nBet : m_nBet);
+  }
+  if (IsSplit()) {
+    m_strSplitMsg = SettleHand(m_handSplit, m_bDoubledSplit != 0 ? 2 * m_nBet : m_nBet);
+  }
+  Repaint();
+}
+
+std::string CFeltsideView::SettleHand(const CBlackjackHand& hand, int stake) {
+  const int total = hand.GetTotal();
+  const int dealer = m_handDealer.GetTotal();
+  if (total <= kTwentyOne && total == dealer) return "Push!";
+  const bool won = total <= kTwentyOne && (dealer > kTwentyOne || dealer < total);
+  m_dWallet += won ? stake : -stake;
+  return won ? "Winner!" : "Dealer Wins!";
+}
+
+}  // namespace feltside

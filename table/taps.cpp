@@ -1,0 +1,78 @@
+// Taps on the table.
+
+#include "platform/application.h"
+#include "table/feltside_view.h"
+
+namespace feltside {
+namespace {
+
+/// The button that the video-poker picture shows; it stays where it is whatever the client size.
+constexpr platform::Rect kFancyDealButton{70, 180, 155, 215};
+
+}  // namespace
+
+using platform::Point;
+
+void CFeltsideView::OnLButtonDown(Point p) {
+  if (m_nGameType == kGameVideoPoker) {
+    TapVideoPoker(p);
+  } else {
+    TapBlackjack(p);
+  }
+}
+
+void CFeltsideView::TapBlackjack(Point p) {
+  if (IsStrategyButtonLive() && m_layout.HitStrategyButton(p) != 0) {
+    m_bShowAdvice = 1;
+    Repaint();
+  }
+  // The targets below are placed by a measured text, so the layout needs a surface to measure on.
+  platform::CBitmap nothing;
+  platform::CSurface surface(nothing);
+  m_layout.Prepare(surface, GetClientRect());
+  if (m_bInsuranceOffered != 0) {
+    TapInsurance(p);
+  } else if (m_bHandInProgress == 0) {
+    TapStake(p);
+  }
+}
+
+/// Before the first table frame nothing stands on the table that could be hit.
+bool CFeltsideView::IsStrategyButtonLive() const {
+  return m_bShowTitle == 0 && m_nStrategyMode == kStrategyButton && m_bShowAdvice == 0;
+}
+
+void CFeltsideView::TapInsurance(Point p) {
+  if (m_layout.HitInsuranceYes(p) != 0) {
+    AnswerInsurance(1);
+  } else if (m_layout.HitInsuranceNo(p) != 0) {
+    AnswerInsurance(0);
+  }
+}
+
+/// The two buttons' areas overlap by a few columns; a tap there lowers and then raises.
+void CFeltsideView::TapStake(Point p) {
+  if (m_layout.HitBetDown(p) != 0) LowerBet();
+  if (m_layout.HitBetUp(p) != 0) RaiseBet();
+  Repaint();
+}
+
+void CFeltsideView::TapVideoPoker(Point p) {
+  if (IsOnDealButton(p)) {
+    if (m_bHandInProgress != 0) {
+      DrawVideoPoker();
+    } else {
+      OnDeal();
+    }
+    return;
+  }
+  if (m_bDrawPending == 0) return;
+  if (const int slot = m_layout.HitTestCard(p); slot >= 0) ToggleDiscard(slot);
+}
+
+bool CFeltsideView::IsOnDealButton(Point p) const {
+  if (m_bFancyPoker != 0) return kFancyDealButton.Contains(p);
+  return m_bShowTitle == 0 && m_layout.HitDealButton(p) != 0;
+}
+
+}  // namespace feltside
