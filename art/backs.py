@@ -16,12 +16,9 @@ PANEL = 3
 
 
 def make_all(folder):
-    """Writes all backs; returns their paths in the order of their numbers."""
-    paths = []
+    """Writes all backs."""
     for number, (name, make, max_colours) in enumerate(BACKS, FIRST_NUMBER):
-        paths.append(folder / f"{number:03}_back_{name}.png")
-        make().save(paths[-1], max_colours)
-    return paths
+        make().save(folder / f"{number:03}_back_{name}.png", max_colours)
 
 
 def _panel(pattern, border):

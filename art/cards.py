@@ -46,13 +46,11 @@ PIP_SIZES = {"2": "index", "3": "index", "9": "tiny", "10": "tiny"}
 
 
 def make_all(folder):
-    """Writes all faces; returns their paths in the order of their numbers."""
-    paths = []
-    for suit in SUITS:
-        for name, letter in RANKS:
-            paths.append(folder / f"{len(paths) + 1:03}_{name}_of_{suit}.png")
-            make_face(suit, name, letter).save(paths[-1], 16)
-    return paths
+    """Writes all faces, numbered from 1."""
+    faces = [(suit, name, letter) for suit in SUITS for name, letter in RANKS]
+    for number, (suit, name, letter) in enumerate(faces, 1):
+        path = folder / f"{number:03}_{name}_of_{suit}.png"
+        make_face(suit, name, letter).save(path, max_colours=16)
 
 
 def make_face(suit, name, letter):

@@ -9,9 +9,7 @@ constexpr int kBestTotal = 21;
 
 }  // namespace
 
-int CBlackjackHand::GetTotal() const {
-  return HardTotal() + (IsSoft() != 0 ? kAceRaise : 0);
-}
+int CBlackjackHand::GetTotal() const { return HardTotal() + (IsSoft() != 0 ? kAceRaise : 0); }
 
 int CBlackjackHand::IsPair() const {
   const int first = GetCard(0);

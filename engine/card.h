@@ -19,9 +19,7 @@ inline constexpr int kKing = 13;
 inline constexpr int kSuits = 4;
 inline constexpr int kNoSuit = 4;  ///< of anything that is not a card
 
-constexpr bool IsCard(int card) {
-  return card >= 1 && card <= kDeckSize;
-}
+constexpr bool IsCard(int card) { return card >= 1 && card <= kDeckSize; }
 
 /// 1 (ace, always low) to 13 (king). Only a card has a rank worth asking for; other numbers give
 /// some number not above 13.
@@ -31,8 +29,6 @@ constexpr int RankOf(int card) {
 }
 
 /// What a card counts in blackjack with the ace low: 1 to 10, or 0 if it is not a card.
-constexpr int PointsOf(int card) {
-  return IsCard(card) ? std::min(RankOf(card), 10) : 0;
-}
+constexpr int PointsOf(int card) { return IsCard(card) ? std::min(RankOf(card), 10) : 0; }
 
 }  // namespace feltside

@@ -43,8 +43,6 @@ void CCardHand::Sort(int bAscending, int bByValue) {
   }
 }
 
-void CCardHand::SetLimit(int limit) {
-  m_nLimit = std::clamp(limit, 0, kSlots);
-}
+void CCardHand::SetLimit(int limit) { m_nLimit = std::clamp(limit, 0, kSlots); }
 
 }  // namespace feltside

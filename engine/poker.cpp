@@ -11,9 +11,7 @@ namespace {
 
 constexpr int kFullHand = 5;  // cards in a straight or a flush
 
-int RankAt(const CCardHand& sorted, int slot) {
-  return RankOf(sorted.GetCard(slot));
-}
+int RankAt(const CCardHand& sorted, int slot) { return RankOf(sorted.GetCard(slot)); }
 
 // Neighbouring ranks, each one higher than the one before, counted without repetitions.
 struct RankRun {
@@ -49,9 +47,7 @@ RankRun LongestRankRun(const CCardHand& sorted) {
   return LongerRun(best, run);
 }
 
-bool IsStraight(const CCardHand& sorted) {
-  return LongestRankRun(sorted).length >= kFullHand;
-}
+bool IsStraight(const CCardHand& sorted) { return LongestRankRun(sorted).length >= kFullHand; }
 
 // The cards of the straight, from the lowest up; none if there is no straight.
 CCardHand CollectStraight(const CCardHand& sorted) {
@@ -84,9 +80,7 @@ bool IsFlush(const CCardHand& hand) {
   return *std::max_element(count.begin(), count.begin() + kSuits) + count[kNoSuit] >= kFullHand;
 }
 
-bool IsStraightFlush(const CCardHand& sorted) {
-  return IsFlush(CollectStraight(sorted));
-}
+bool IsStraightFlush(const CCardHand& sorted) { return IsFlush(CollectStraight(sorted)); }
 
 bool IsRoyalFlush(const CCardHand& sorted) {
   CCardHand straight = CollectStraight(sorted);

@@ -80,13 +80,14 @@ void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplat
 
 void CApplication::ShowMainWindow(int iconID) {
   m_pMainFrame = m_pDocTemplate->Frame();
-  TheHost().SetIdentity(m_pMainFrame->GetTitle(), m_resources.LoadIconSizes(iconID));
+  // Desktops scale the icon to their own sizes; a larger one would only cost memory.
+  constexpr int kWindowIconWidth = 48;
+  TheHost().SetIdentity(m_pMainFrame->GetTitle(),
+                        m_resources.LoadIconOfSize(iconID, kWindowIconWidth));
   m_pMainFrame->Open();
   OnIdle();
 }
 
-bool CApplication::OpenNewDocument() {
-  return m_pDocTemplate->OpenNewDocument();
-}
+bool CApplication::OpenNewDocument() { return m_pDocTemplate->OpenNewDocument(); }
 
 }  // namespace platform

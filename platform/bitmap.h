@@ -22,9 +22,7 @@ constexpr Color ToColor(Pixel pixel) {
              static_cast<int>(pixel & 0xFF));
 }
 
-constexpr bool IsOpaque(Pixel pixel) {
-  return (pixel >> 24) != 0;
-}
+constexpr bool IsOpaque(Pixel pixel) { return (pixel >> 24) != 0; }
 
 /// A block of pixels in memory, row by row from the top. Copied by value.
 class CBitmap {

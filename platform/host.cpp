@@ -7,9 +7,7 @@ namespace {
 Host* g_pHost = nullptr;
 }  // namespace
 
-void SetHost(Host* host) {
-  g_pHost = host;
-}
+void SetHost(Host* host) { g_pHost = host; }
 
 Host& TheHost() {
   if (g_pHost == nullptr) std::abort();

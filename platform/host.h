@@ -2,8 +2,8 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <optional>
 #include <string>
-#include <vector>
 
 #include "platform/bitmap.h"
 #include "platform/input.h"
@@ -21,8 +21,8 @@ class Host {
 
   /// Puts a whole picture of the program's window, always of the same size, before the person.
   virtual void Show(const CBitmap& frame) = 0;
-  /// Names the window and gives it an icon; of several sizes the machine takes what fits.
-  virtual void SetIdentity(const std::string& title, const std::vector<CBitmap>& icons) = 0;
+  /// Names the window and gives it an icon, where there is one.
+  virtual void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) = 0;
 
   /// Takes the oldest input that has come, without waiting. False: there is none.
   virtual bool NextEvent(InputEvent& event) = 0;

@@ -15,9 +15,7 @@ constexpr int kSeparatorHeight = 7;
 constexpr int kIndent = 12;
 constexpr int kEdge = 2;
 
-int HeightOf(const MenuItem& item) {
-  return item.commandID == 0 ? kSeparatorHeight : kLineHeight;
-}
+int HeightOf(const MenuItem& item) { return item.commandID == 0 ? kSeparatorHeight : kLineHeight; }
 
 }  // namespace
 

@@ -4,13 +4,9 @@
 
 namespace platform {
 
-void CMessageQueue::PostCommand(int commandID) {
-  Post({MessageKind::kCommand, {}, commandID, 0});
-}
+void CMessageQueue::PostCommand(int commandID) { Post({MessageKind::kCommand, {}, commandID, 0}); }
 
-void CMessageQueue::PostQuit(int exitCode) {
-  Post({MessageKind::kQuit, {}, 0, exitCode});
-}
+void CMessageQueue::PostQuit(int exitCode) { Post({MessageKind::kQuit, {}, 0, exitCode}); }
 
 bool CMessageQueue::Peek(Message& message) {
   Collect();

@@ -9,7 +9,7 @@ void OffscreenHost::Show(const CBitmap& frame) {
   if (m_onFrame) m_onFrame(frame);
 }
 
-void OffscreenHost::SetIdentity(const std::string& title, const std::vector<CBitmap>&) {
+void OffscreenHost::SetIdentity(const std::string& title, const std::optional<CBitmap>&) {
   m_strTitle = title;
 }
 

@@ -32,7 +32,7 @@ class OffscreenHost : public Host {
   bool WantsText() const { return m_bWantsText; }
 
   void Show(const CBitmap& frame) override;
-  void SetIdentity(const std::string& title, const std::vector<CBitmap>& icons) override;
+  void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override;
   bool NextEvent(InputEvent& event) override;
   void WaitEvent(int milliseconds) override;
   std::int64_t Ticks() override { return m_nTicks; }

@@ -42,8 +42,6 @@ bool SavePng(const CBitmap& bitmap, const std::string& path) {
   return surface != nullptr && IMG_SavePNG(surface.get(), path.c_str()) == 0;
 }
 
-std::optional<CBitmap> LoadPng(const std::string& path) {
-  return ToBitmap(IMG_Load(path.c_str()));
-}
+std::optional<CBitmap> LoadPng(const std::string& path) { return ToBitmap(IMG_Load(path.c_str())); }
 
 }  // namespace platform

@@ -60,9 +60,7 @@ void SetAside(const fs::path& file) {
             << " and the defaults hold.\n";
 }
 
-fs::path LockOf(const fs::path& file) {
-  return file.string() + ".lock";
-}
+fs::path LockOf(const fs::path& file) { return file.string() + ".lock"; }
 
 /// Reads under the lock that the caller holds, and sets aside what cannot be understood.
 ReadProfile ReadLocked(const fs::path& file) {

@@ -48,13 +48,12 @@ const CBitmap& CResources::Load(const std::string& kind, int resourceID, Size bl
   return m_mapLoaded.emplace(prefix, picture ? *picture : Blank(blank, resourceID)).first->second;
 }
 
-std::vector<CBitmap> CResources::LoadIconSizes(int resourceID) const {
-  std::vector<CBitmap> sizes;
+std::optional<CBitmap> CResources::LoadIconOfSize(int resourceID, int width) const {
   for (const EmbeddedFile& file : m_files) {
-    if (!StartsWith(file.name, FilePrefix("icon_", resourceID))) continue;
-    if (const auto picture = DecodePicture(file)) sizes.push_back(*picture);
+    const std::string name = FilePrefix("icon_", resourceID) + std::to_string(width) + ".png";
+    if (file.name == name) return DecodePicture(file);
   }
-  return sizes;
+  return std::nullopt;
 }
 
 }  // namespace platform

@@ -3,7 +3,6 @@
 #include <map>
 #include <optional>
 #include <string>
-#include <vector>
 
 #include "platform/bitmap.h"
 #include "platform/embedded.h"
@@ -21,8 +20,9 @@ class CResources {
   const CBitmap& LoadBitmap(int resourceID, Size blank);
   /// The icon of that number, with the same rule.
   const CBitmap& LoadIcon(int resourceID, Size blank);
-  /// All pictures of an icon that comes in several sizes.
-  std::vector<CBitmap> LoadIconSizes(int resourceID) const;
+  /// The picture of an icon that comes in several sizes, by its width in pixels; nothing where it
+  /// does not come in that size.
+  std::optional<CBitmap> LoadIconOfSize(int resourceID, int width) const;
 
  private:
   const CBitmap& Load(const std::string& prefix, int resourceID, Size blank);

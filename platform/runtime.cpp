@@ -7,20 +7,12 @@
 
 namespace platform {
 
-LocalTime GetLocalTime() {
-  return TheHost().Now();
-}
+LocalTime GetLocalTime() { return TheHost().Now(); }
 
-void SeedRandom(unsigned seed) {
-  std::srand(seed);
-}
+void SeedRandom(unsigned seed) { std::srand(seed); }
 
-int NextRandom() {
-  return std::rand();
-}
+int NextRandom() { return std::rand(); }
 
-void Sleep(int milliseconds) {
-  TheApp().Queue().Pause(milliseconds);
-}
+void Sleep(int milliseconds) { TheApp().Queue().Pause(milliseconds); }
 
 }  // namespace platform

@@ -43,8 +43,8 @@ class SdlHost : public Host {
   bool IsReady() const { return m_window.IsOpen(); }
 
   void Show(const CBitmap& frame) override { m_window.Show(frame); }
-  void SetIdentity(const std::string& title, const std::vector<CBitmap>& icons) override {
-    m_window.SetIdentity(title, icons);
+  void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override {
+    m_window.SetIdentity(title, icon);
   }
 
   bool NextEvent(InputEvent& event) override {

@@ -32,9 +32,7 @@ SdlWindow::SdlWindow(Size frameSize) : m_frameSize(frameSize) {
   if (!Open(true)) Open(false);
 }
 
-SdlWindow::~SdlWindow() {
-  Release();
-}
+SdlWindow::~SdlWindow() { Release(); }
 
 /// Plain is quickest and smallest: pixels in memory, handed to the desktop as they are. Displays
 /// without such a path take what SDL thinks best.
@@ -78,12 +76,9 @@ int SdlWindow::ComfortableMultiple() const {
   return std::max(1, std::min(across, down));
 }
 
-void SdlWindow::SetIdentity(const std::string& title, const std::vector<CBitmap>& icons) {
+void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) {
   SDL_SetWindowTitle(m_pWindow, title.c_str());
-  const auto largest = std::max_element(
-      icons.begin(), icons.end(),
-      [](const CBitmap& a, const CBitmap& b) { return a.GetSize().width < b.GetSize().width; });
-  if (largest != icons.end()) SetIcon(m_pWindow, *largest);
+  if (icon) SetIcon(m_pWindow, *icon);
 }
 
 void SdlWindow::Show(const CBitmap& frame) {

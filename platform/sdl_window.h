@@ -2,8 +2,8 @@
 
 #include <SDL.h>
 
+#include <optional>
 #include <string>
-#include <vector>
 
 #include "platform/bitmap.h"
 
@@ -20,7 +20,7 @@ class SdlWindow {
 
   /// Whether there is something to draw on.
   bool IsOpen() const { return m_pTexture != nullptr; }
-  void SetIdentity(const std::string& title, const std::vector<CBitmap>& icons);
+  void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon);
   void Show(const CBitmap& frame);
   /// Shows the last picture again.
   void Refresh();

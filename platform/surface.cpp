@@ -9,24 +9,15 @@ CSurface::CSurface(CBitmap& target) : CSurface(target, target.Bounds()) {}
 
 CSurface::CSurface(CBitmap& target, const Rect& part) : m_pTarget(&target), m_part(part) {}
 
-Font CSurface::SetFont(const Font& font) {
-  return std::exchange(m_state.font, font);
-}
-Color CSurface::SetTextColor(Color color) {
-  return std::exchange(m_state.textColor, color);
-}
-Color CSurface::SetBackColor(Color color) {
-  return std::exchange(m_state.backColor, color);
-}
-BackMode CSurface::SetBackMode(BackMode mode) {
-  return std::exchange(m_state.backMode, mode);
-}
-Color CSurface::SetBrush(Color color) {
-  return std::exchange(m_state.brush, color);
-}
-Color CSurface::SetPen(Color color) {
-  return std::exchange(m_state.pen, color);
-}
+CSurface::CSurface(const CSurface& whole, const Rect& part)
+    : CSurface(*whole.m_pTarget, part.Moved(whole.m_part.TopLeft()).Common(whole.m_part)) {}
+
+Font CSurface::SetFont(const Font& font) { return std::exchange(m_state.font, font); }
+Color CSurface::SetTextColor(Color color) { return std::exchange(m_state.textColor, color); }
+Color CSurface::SetBackColor(Color color) { return std::exchange(m_state.backColor, color); }
+BackMode CSurface::SetBackMode(BackMode mode) { return std::exchange(m_state.backMode, mode); }
+Color CSurface::SetBrush(Color color) { return std::exchange(m_state.brush, color); }
+Color CSurface::SetPen(Color color) { return std::exchange(m_state.pen, color); }
 
 /// Calls the rule with each pixel of the rectangle that the target has, and its place on this
 /// surface.
@@ -90,9 +81,7 @@ void CSurface::DrawStencil(Point at, const CBitmap& stencil, Color color) {
   });
 }
 
-Size CSurface::TextExtent(const std::string& text) const {
-  return MeasureText(m_state.font, text);
-}
+Size CSurface::TextExtent(const std::string& text) const { return MeasureText(m_state.font, text); }
 
 void CSurface::TextOut(Point at, const std::string& text) {
   const CBitmap stencil = RenderText(m_state.font, text);

@@ -29,6 +29,8 @@ class CSurface {
  public:
   explicit CSurface(CBitmap& target);
   CSurface(CBitmap& target, const Rect& part);
+  /// A part of another surface, in a drawing state of its own.
+  CSurface(const CSurface& whole, const Rect& part);
 
   Rect Bounds() const { return RectAt({}, {m_part.Width(), m_part.Height()}); }
 

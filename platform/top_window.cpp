@@ -12,17 +12,11 @@ CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
       m_kind(kind),
       m_pixels({place.Width(), place.Height()}) {}
 
-CTopWindow::~CTopWindow() {
-  Close();
-}
+CTopWindow::~CTopWindow() { Close(); }
 
-void CTopWindow::Open() {
-  TheApp().Screen().Push(*this);
-}
+void CTopWindow::Open() { TheApp().Screen().Push(*this); }
 
-void CTopWindow::Close() {
-  TheApp().Screen().Remove(*this);
-}
+void CTopWindow::Close() { TheApp().Screen().Remove(*this); }
 
 void CTopWindow::PaintIfNeeded() {
   if (PaintInto(m_pixels, {}, false)) TheApp().Screen().MarkStale();

@@ -48,9 +48,7 @@ void CWindow::EnableWindow(bool enabled) {
   Invalidate();
 }
 
-void CWindow::Invalidate() {
-  m_bInvalid = true;
-}
+void CWindow::Invalidate() { m_bInvalid = true; }
 
 void CWindow::UpdateWindow() {
   TopLevel().PaintIfNeeded();

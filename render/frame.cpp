@@ -20,9 +20,7 @@ using platform::CSurface;
 using platform::Rect;
 
 /// The paint covers every pixel itself, so nothing is to be cleared before it.
-bool CFeltsideView::OnEraseBkgnd(CSurface&) {
-  return true;
-}
+bool CFeltsideView::OnEraseBkgnd(CSurface&) { return true; }
 
 void CFeltsideView::OnDraw(CSurface& surface) {
   if (m_bShowTitle != 0) {
@@ -62,12 +60,8 @@ void CFeltsideView::LoadTitleBitmap() {
   if (m_bShowTitle != 0) LoadOnce(m_pTitleBitmap, IDB_TITLE, kTitlePicture);
 }
 
-void CFeltsideView::LoadTableBitmap() {
-  LoadOnce(m_pTableBitmap, IDB_TABLE, kTablePicture);
-}
+void CFeltsideView::LoadTableBitmap() { LoadOnce(m_pTableBitmap, IDB_TABLE, kTablePicture); }
 
-void CFeltsideView::LoadPokerBitmap() {
-  LoadOnce(m_pPokerBitmap, IDB_POKER_TABLE, kPokerPicture);
-}
+void CFeltsideView::LoadPokerBitmap() { LoadOnce(m_pPokerBitmap, IDB_POKER_TABLE, kPokerPicture); }
 
 }  // namespace feltside

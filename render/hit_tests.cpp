@@ -34,9 +34,7 @@ int CTableLayout::HitBetUp(Point p) const {
   return Rect{Center().x - 21, top, Center().x - 1, top + 20}.Contains(p) ? 1 : 0;
 }
 
-int CTableLayout::HitDealButton(Point p) const {
-  return PlayButtonRect().Contains(p) ? 1 : 0;
-}
+int CTableLayout::HitDealButton(Point p) const { return PlayButtonRect().Contains(p) ? 1 : 0; }
 
 int CTableLayout::HitTestCard(Point p) const {
   if (!GetPosRect(POS_MIDDLE_ROW).Contains(p)) return -1;

@@ -4,7 +4,7 @@
 #include <memory>
 
 #include "platform/document_template.h"
-#include "platform/host.h"
+#include "shell/about_dlg.h"
 #include "shell/feltside_doc.h"
 #include "shell/main_frame.h"
 #include "shell/res/frame_resources.h"
@@ -16,11 +16,14 @@ namespace feltside {
 struct CFeltsideApp::Commands {
   using App = CFeltsideApp;
   /// There is no file to open on this system: to open is to start with a new document.
-  static constexpr std::array<platform::CommandEntry<App>, 2> kMap = {{
+  static constexpr std::array<platform::CommandEntry<App>, 3> kMap = {{
       {platform::kCommandNew, &App::OnNew},
       {platform::kCommandOpen, &App::OnNew},
+      {platform::kCommandAbout, &App::OnAbout},
   }};
 };
+
+CFeltsideApp& TheFeltsideApp() { return static_cast<CFeltsideApp&>(platform::TheApp()); }
 
 CFeltsideApp::CFeltsideApp() : CApplication("Feltside", PictureFiles()) {}
 
@@ -28,9 +31,7 @@ platform::CommandState CFeltsideApp::QueryCommand(int commandID) const {
   return QueryCommandMap(*this, Commands::kMap, commandID);
 }
 
-void CFeltsideApp::RunCommand(int commandID) {
-  RunCommandMap(*this, Commands::kMap, commandID);
-}
+void CFeltsideApp::RunCommand(int commandID) { RunCommandMap(*this, Commands::kMap, commandID); }
 
 bool CFeltsideApp::InitInstance() {
   SetRegistryKey("Quillworks");
@@ -43,11 +44,17 @@ bool CFeltsideApp::InitInstance() {
   AddDocTemplate(std::make_unique<platform::CSingleDocTemplate>(kDocumentString, makers));
   if (!OpenNewDocument()) return false;
   ShowMainWindow(IDR_MAINFRAME);
+  LoadHighScores();
   return true;
 }
 
-void CFeltsideApp::OnNew() {
-  OpenNewDocument();
+int CFeltsideApp::ExitInstance() {
+  SaveHighScores();
+  return CApplication::ExitInstance();
 }
+
+void CFeltsideApp::OnNew() { OpenNewDocument(); }
+
+void CFeltsideApp::OnAbout() { CAboutDlg().DoModal(); }
 
 }  // namespace feltside

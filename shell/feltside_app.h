@@ -1,5 +1,8 @@
 #pragma once
 
+#include <string>
+#include <vector>
+
 #include "platform/application.h"
 
 namespace feltside {
@@ -12,13 +15,33 @@ class CFeltsideApp : public platform::CApplication {
   platform::CommandState QueryCommand(int commandID) const override;
   void RunCommand(int commandID) override;
 
+  /// The best results so far, best first, at most five: each a name, a blank and the score in whole
+  /// dollars.
+  const std::vector<std::string>& HighScores() const { return m_arrHighScores; }
+  /// The whole number behind an entry's last blank; 0 where no digits stand there, the nearest
+  /// bound where it is beyond an int.
+  static int ScoreOf(const std::string& entry);
+  /// Enters a result below all that are as good; the sixth of a list falls off.
+  void AddHighScore(const std::string& name, int score);
+  /// Whether a result earns a place.
+  bool IsHighScore(int score) const;
+
  protected:
   bool InitInstance() override;
+  int ExitInstance() override;
 
  private:
   struct Commands;
 
   void OnNew();
+  void OnAbout();
+  void LoadHighScores();
+  void SaveHighScores() const;
+
+  std::vector<std::string> m_arrHighScores;
 };
+
+/// The one application object.
+CFeltsideApp& TheFeltsideApp();
 
 }  // namespace feltside

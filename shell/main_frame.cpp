@@ -1,8 +1,18 @@
 #include "shell/main_frame.h"
 
+#include <array>
+
+#include "platform/host.h"
 #include "shell/res/frame_resources.h"
+#include "table/command_ids.h"
 
 namespace feltside {
+
+struct CMainFrame::Commands {
+  static constexpr std::array<platform::CommandEntry<CMainFrame>, 1> kMap = {{
+      {kCommandHelp, &CMainFrame::OnHelp},
+  }};
+};
 
 CMainFrame::CMainFrame(const std::string& title)
     : CFrameWindow(title, MainAccelerators()),
@@ -14,6 +24,16 @@ int CMainFrame::OnCreate() {
   m_wndCommandBar.AddAdornments();
   m_wndCommandBar.LoadToolBar(MainToolBar());
   return 0;
+}
+
+platform::CommandState CMainFrame::QueryCommand(int commandID) const {
+  return QueryCommandMap(*this, Commands::kMap, commandID);
+}
+
+void CMainFrame::RunCommand(int commandID) { RunCommandMap(*this, Commands::kMap, commandID); }
+
+void CMainFrame::OnHelp() {
+  platform::TheHost().StartHelpViewer("file:feltside.htm#Main_Contents");
 }
 
 bool CMainFrame::OnKeyDown(const platform::KeyStroke& stroke) {

@@ -13,8 +13,14 @@ class CMainFrame : public platform::CFrameWindow {
   int OnCreate() override;
   void RefreshCommandStates() override { m_wndCommandBar.RefreshStates(); }
   bool OnKeyDown(const platform::KeyStroke& stroke) override;
+  platform::CommandState QueryCommand(int commandID) const override;
+  void RunCommand(int commandID) override;
 
  private:
+  struct Commands;
+
+  void OnHelp();
+
   platform::CCommandBar m_wndCommandBar;
 };
 

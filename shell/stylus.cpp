@@ -7,6 +7,8 @@
 #include <cstdlib>
 #include <sstream>
 
+#include "platform/combo_box.h"
+#include "platform/slider.h"
 #include "shell/table_state.h"
 #include "table/command_ids.h"
 
@@ -39,9 +41,7 @@ double ToMoney(const std::string& word) {
   return value;
 }
 
-bool IsLeapYear(int year) {
-  return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
-}
+bool IsLeapYear(int year) { return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0; }
 
 bool IsDate(const platform::LocalTime& t) {
   if (t.month < 1 || t.month > 12) return false;
@@ -56,6 +56,33 @@ CFeltsideView& View() {
   return static_cast<CFeltsideView&>(platform::TheApp().MainFrame()->View());
 }
 
+/// The topmost dialog or message box; null while none is open.
+platform::CDialog* TopDialog() {
+  const auto& windows = platform::TheApp().Screen().Windows();
+  for (auto window = windows.rbegin(); window != windows.rend(); ++window) {
+    if (auto* dialog = dynamic_cast<platform::CDialog*>(*window)) return dialog;
+  }
+  return nullptr;
+}
+
+void DismissPopups() {
+  platform::CScreen& screen = platform::TheApp().Screen();
+  while (screen.Top()->GetKind() == platform::CTopWindow::Kind::kPopup) {
+    screen.Top()->OnPressOutside();
+  }
+}
+
+nlohmann::ordered_json ToJson(const platform::CControl& control) {
+  const platform::Rect place = control.GetClientRect().Moved(control.ScreenOrigin());
+  return {{"number", control.GetID()},
+          {"kind", control.KindName()},
+          {"text", control.GetText()},
+          {"value", control.GetValue()},
+          {"visible", control.IsVisible()},
+          {"enabled", control.IsEnabled()},
+          {"rect", {place.left, place.top, place.right, place.bottom}}};
+}
+
 }  // namespace
 
 const std::vector<CStylus::Command>& CStylus::Commands() {
@@ -65,6 +92,9 @@ const std::vector<CStylus::Command>& CStylus::Commands() {
       {"command", 1, 1, &CStylus::ChooseCommand},
       {"key", 1, 1, &CStylus::PressKey},
       {"type", 1, kAnyNumber, &CStylus::Type},
+      {"press", 1, 1, &CStylus::Press},
+      {"select", 2, 2, &CStylus::Select},
+      {"slide", 2, 2, &CStylus::Slide},
       {"clock", 1, 1, &CStylus::SetClock},
       {"stack", 1, kAnyNumber, &CStylus::Stack},
       {"wallet", 1, 1, &CStylus::SetWallet},
@@ -139,6 +169,10 @@ CStylus::Json CStylus::State() {
   for (const platform::CTopWindow* window : m_app.Screen().Windows()) {
     state["windows"].push_back(window->GetTitle());
   }
+  state["controls"] = Json::array();
+  if (const platform::CDialog* dialog = TopDialog()) {
+    for (const auto& control : dialog->Controls()) state["controls"].push_back(ToJson(*control));
+  }
   state["helps"] = m_host.HelpCalls();
   state["running"] = true;
   return state;
@@ -173,8 +207,7 @@ void CStylus::Touch(const Words& words) {
 
 void CStylus::ChooseCommand(const Words& words) {
   const int commandID = ToInt(words[1]);
-  platform::CTopWindow* top = m_app.Screen().Top();
-  if (top->GetKind() == platform::CTopWindow::Kind::kPopup) top->OnPressOutside();
+  DismissPopups();
   if (m_app.MainFrame()->IsCommandEnabled(commandID)) {
     m_app.Queue().PostCommand(commandID);
   } else {
@@ -196,6 +229,50 @@ void CStylus::Type(const Words& words) {
   event.kind = platform::InputKind::kText;
   event.text = words[0].substr(words[0].find("type") + 5);
   m_host.PutInput(event);
+}
+
+platform::CDialog& CStylus::ClearedDialog() {
+  platform::CDialog* dialog = TopDialog();
+  if (dialog == nullptr) throw std::string("no dialog is open");
+  DismissPopups();
+  return *dialog;
+}
+
+platform::CControl& CStylus::LiveControl(const std::string& word) {
+  const int controlID = ToInt(word);
+  platform::CControl* control = ClearedDialog().GetDlgItem(controlID);
+  if (control == nullptr || !control->IsVisible() || !control->IsEnabled()) {
+    throw std::string("no such control: " + word);
+  }
+  return *control;
+}
+
+void CStylus::Press(const Words& words) {
+  const platform::CControl& control = LiveControl(words[1]);
+  const std::string kind = control.KindName();
+  if (kind != "button" && kind != "check" && kind != "list") {
+    throw std::string("not to be pressed: " + words[1]);
+  }
+  const platform::Rect place = control.GetClientRect();
+  PutTap(control.ScreenOrigin() + platform::Point{place.right / 2, place.bottom / 2});
+}
+
+void CStylus::Select(const Words& words) {
+  const int item = ToInt(words[2]);
+  auto* list = dynamic_cast<platform::CComboBox*>(&LiveControl(words[1]));
+  if (list == nullptr) throw std::string("no list: " + words[1]);
+  if (item < 0 || item >= list->GetItemCount()) throw std::string("no such item: " + words[2]);
+  list->Choose(item);
+}
+
+void CStylus::Slide(const Words& words) {
+  const int value = ToInt(words[2]);
+  auto* slider = dynamic_cast<platform::CSlider*>(&LiveControl(words[1]));
+  if (slider == nullptr) throw std::string("no slider: " + words[1]);
+  if (value < slider->GetLowest() || value > slider->GetHighest()) {
+    throw std::string("beyond the slider's range: " + words[2]);
+  }
+  slider->MoveTo(value);
 }
 
 void CStylus::SetClock(const Words& words) {

@@ -5,6 +5,7 @@
 #include <ostream>
 #include <string>
 
+#include "platform/dialog.h"
 #include "platform/offscreen_host.h"
 #include "shell/feltside_app.h"
 
@@ -48,7 +49,14 @@ class CStylus {
   void Shot(const Words& words);
   void ShowState(const Words&) {}
   void Close(const Words& words);
+  void Press(const Words& words);
+  void Select(const Words& words);
+  void Slide(const Words& words);
   void PutTap(platform::Point at);
+  /// The dialog on top, menus and lists over it closed; throws where there is none.
+  platform::CDialog& ClearedDialog();
+  /// A control that can be worked with; throws where there is none of that number.
+  platform::CControl& LiveControl(const std::string& word);
 
   platform::OffscreenHost& m_host;
   CFeltsideApp& m_app;

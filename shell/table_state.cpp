@@ -21,9 +21,7 @@ Json ToJson(const CShoe& shoe) {
           {"shuffles", shoe.GetShuffles()}};
 }
 
-Json ToJson(const platform::Rect& rect) {
-  return {rect.left, rect.top, rect.right, rect.bottom};
-}
+Json ToJson(const platform::Rect& rect) { return {rect.left, rect.top, rect.right, rect.bottom}; }
 
 Json ToJson(const CTableLayout& layout) {
   return {{"m_rcTable", ToJson(layout.m_rcTable)},
@@ -39,9 +37,7 @@ Json ToJson(const CTableLayout& layout) {
 }
 
 /// A picture's pointer as a flag: whether it is loaded.
-int IsLoaded(const std::unique_ptr<platform::CBitmap>& picture) {
-  return picture ? 1 : 0;
-}
+int IsLoaded(const std::unique_ptr<platform::CBitmap>& picture) { return picture ? 1 : 0; }
 
 }  // namespace
 

@@ -10,9 +10,7 @@ constexpr int kTwentyOne = 21;
 constexpr int kBetStep = 5;
 constexpr char kBlackjackText[] = "Blackjack!";
 
-std::string TotalText(const CBlackjackHand& hand) {
-  return std::to_string(hand.GetTotal());
-}
+std::string TotalText(const CBlackjackHand& hand) { return std::to_string(hand.GetTotal()); }
 
 }  // namespace
 

@@ -50,12 +50,16 @@ class CFeltsideView : public platform::CView {
   void OnDoubleDown();
   void OnSplit();
   void OnDeal();
+  void OnGameSetup();
+  void OnTableSetup();
+  void OnHighScores();
   void OnExit();
   bool CanDeal() const;
   bool CanHit() const;
   bool CanStand() const;
   bool CanDoubleDown() const;
   bool CanSplit() const;
+  bool CanShowHighScores() const;
   void JudgeMove(int adviceCode);
 
   // Blackjack.

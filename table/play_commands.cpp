@@ -10,13 +10,16 @@ namespace feltside {
 
 struct CFeltsideView::Commands {
   using View = CFeltsideView;
-  static constexpr std::array<platform::CommandEntry<View>, 6> kMap = {{
+  static constexpr std::array<platform::CommandEntry<View>, 9> kMap = {{
       {kCommandHit, &View::OnHit, &View::CanHit},
       {kCommandDoubleDown, &View::OnDoubleDown, &View::CanDoubleDown},
       {kCommandSplit, &View::OnSplit, &View::CanSplit},
       {kCommandStand, &View::OnStand, &View::CanStand},
       {kCommandDeal, &View::OnDeal, &View::CanDeal},
+      {kCommandTableSetup, &View::OnTableSetup},
       {platform::kCommandExit, &View::OnExit},
+      {kCommandHighScores, &View::OnHighScores, &View::CanShowHighScores},
+      {kCommandGameSetup, &View::OnGameSetup, &View::CanDeal},
   }};
 };
 
@@ -24,13 +27,9 @@ platform::CommandState CFeltsideView::QueryCommand(int commandID) const {
   return QueryCommandMap(*this, Commands::kMap, commandID);
 }
 
-void CFeltsideView::RunCommand(int commandID) {
-  RunCommandMap(*this, Commands::kMap, commandID);
-}
+void CFeltsideView::RunCommand(int commandID) { RunCommandMap(*this, Commands::kMap, commandID); }
 
-bool CFeltsideView::CanDeal() const {
-  return m_bHandInProgress == 0;
-}
+bool CFeltsideView::CanDeal() const { return m_bHandInProgress == 0; }
 
 bool CFeltsideView::CanStand() const {
   return m_nGameType == kGameBlackjack && m_bHandInProgress != 0 && m_bInsuranceOffered == 0;
@@ -41,9 +40,7 @@ bool CFeltsideView::CanHit() const {
   return CanStand() && ActiveHand().GetCount() < ActiveHand().GetLimit();
 }
 
-bool CFeltsideView::CanDoubleDown() const {
-  return CanStand() && ActiveHand().GetCount() <= 2;
-}
+bool CFeltsideView::CanDoubleDown() const { return CanStand() && ActiveHand().GetCount() <= 2; }
 
 bool CFeltsideView::CanSplit() const {
   return CanStand() && !IsSplit() && m_handPlayer.IsPair() != 0;

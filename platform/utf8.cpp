@@ -1,0 +1,67 @@
+#include "platform/utf8.h"
+
+#include <cstdint>
+
+namespace platform {
+namespace {
+
+unsigned ByteAt(const std::string& text, std::size_t at) {
+  return static_cast<unsigned char>(text[at]);
+}
+
+bool IsContinuation(unsigned byte) { return (byte & 0xC0) == 0x80; }
+
+/// The length in bytes of the letter that begins at a place; 0 where no valid one does: a stray or
+/// missing continuation, a surrogate, more bytes than needed, beyond the last code point.
+std::size_t LetterLength(const std::string& text, std::size_t at) {
+  const unsigned first = ByteAt(text, at);
+  if (first < 0x80) return 1;
+  const std::size_t length = first >= 0xF0 ? 4 : first >= 0xE0 ? 3 : 2;
+  if (first < 0xC2 || first > 0xF4 || at + length > text.size()) return 0;
+  std::uint32_t codePoint = first & (0x7FU >> length);
+  for (std::size_t i = 1; i < length; ++i) {
+    const unsigned byte = ByteAt(text, at + i);
+    if (!IsContinuation(byte)) return 0;
+    codePoint = codePoint << 6 | (byte & 0x3F);
+  }
+  const bool surrogate = codePoint >= 0xD800 && codePoint <= 0xDFFF;
+  const bool tooLong = (length == 3 && codePoint < 0x800) || (length == 4 && codePoint < 0x10000);
+  return surrogate || tooLong || codePoint > 0x10FFFF ? 0 : length;
+}
+
+}  // namespace
+
+std::size_t PreviousLetter(const std::string& text, std::size_t at) {
+  if (at == 0) return 0;
+  do {
+    --at;
+  } while (at > 0 && IsContinuation(ByteAt(text, at)));
+  return at;
+}
+
+std::size_t NextLetter(const std::string& text, std::size_t at) {
+  if (at >= text.size()) return text.size();
+  do {
+    ++at;
+  } while (at < text.size() && IsContinuation(ByteAt(text, at)));
+  return at;
+}
+
+std::string OneLine(const std::string& text) {
+  std::string line;
+  for (std::size_t at = 0; at < text.size();) {
+    const std::size_t length = LetterLength(text, at);
+    const bool control = length == 1 && (ByteAt(text, at) < 0x20 || ByteAt(text, at) == 0x7F);
+    // A line break of two characters is one break.
+    const bool secondOfBreak = text[at] == '\n' && at > 0 && text[at - 1] == '\r';
+    if (control) {
+      if (!secondOfBreak) line += ' ';
+    } else {
+      line += text.substr(at, length);
+    }
+    at += length == 0 ? 1 : length;
+  }
+  return line;
+}
+
+}  // namespace platform

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+namespace platform {
+
+/// Where the letter before a place in a UTF-8 text begins; 0 at the start.
+std::size_t PreviousLetter(const std::string& text, std::size_t at);
+
+/// Where the letter after the one at a place begins; the text's size at the end.
+std::size_t NextLetter(const std::string& text, std::size_t at);
+
+/// A text fit for one line: control characters, line breaks among them, become blanks; bytes that
+/// are not UTF-8 are left out.
+std::string OneLine(const std::string& text);
+
+}  // namespace platform

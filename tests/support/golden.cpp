@@ -1,0 +1,51 @@
+#include "tests/support/golden.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <filesystem>
+
+#include "platform/resources.h"
+
+namespace feltside::tests {
+namespace {
+
+namespace fs = std::filesystem;
+using platform::CBitmap;
+
+/// The actual picture, faint, with every pixel that differs in red.
+CBitmap DifferenceOf(const CBitmap& actual, const CBitmap& stored, int& count) {
+  CBitmap difference = actual;
+  for (int y = 0; y < actual.GetSize().height; ++y) {
+    for (int x = 0; x < actual.GetSize().width; ++x) {
+      platform::Pixel& pixel = difference.At({x, y});
+      const bool same = stored.Bounds().Contains({x, y}) && stored.At({x, y}) == pixel;
+      pixel = same ? 0xFFC0C0C0U | (pixel >> 2 & 0x3F3F3FU) : 0xFFFF0000U;
+      count += same ? 0 : 1;
+    }
+  }
+  return difference;
+}
+
+}  // namespace
+
+void ExpectGolden(const CBitmap& actual, const std::string& name) {
+  const fs::path golden = fs::path(FELTSIDE_GOLDEN_FOLDER) / (name + ".png");
+  const char* renew = std::getenv("FELTSIDE_RENEW_GOLDEN");
+  if (renew != nullptr && std::string(renew) == "1") {
+    ASSERT_TRUE(platform::SavePng(actual, golden.string())) << golden;
+    return;
+  }
+  const CBitmap stored = platform::LoadPng(golden.string()).value_or(CBitmap());
+  if (stored == actual) return;
+  int count = 0;
+  const fs::path folder = FELTSIDE_DIFFERENCE_FOLDER;
+  fs::create_directories(folder);
+  platform::SavePng(actual, (folder / (name + ".actual.png")).string());
+  platform::SavePng(DifferenceOf(actual, stored, count),
+                    (folder / (name + ".difference.png")).string());
+  ADD_FAILURE() << count << " pixels differ from " << golden << ": see " << folder
+                << ", or renew the picture with FELTSIDE_RENEW_GOLDEN=1";
+}
+
+}  // namespace feltside::tests

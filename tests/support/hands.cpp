@@ -1,0 +1,66 @@
+#include "tests/support/hands.h"
+
+#include <sstream>
+#include <vector>
+
+namespace feltside::tests {
+namespace {
+
+std::string JoinWords(const std::vector<std::string>& words) {
+  std::string text;
+  for (const std::string& word : words) {
+    if (!word.empty()) text += (text.empty() ? "" : " ") + word;
+  }
+  return text;
+}
+
+std::string Dollars(double amount) {
+  std::ostringstream text;
+  text << amount;
+  return text.str();
+}
+
+std::string Flags(const Json& state) {
+  const auto word = [&state](const char* member, const char* name) {
+    return std::string(state[member] == 1 ? name : "");
+  };
+  return JoinWords({word("m_bInsuranceTaken", "insured"), word("m_bDoubledPlayer", "doubled"),
+                    word("m_bPlayingSplit", "second"), word("m_bDoubledSplit", "doubled second")});
+}
+
+std::string Moves(const Json& state) {
+  const Json& enabled = state["enabled"];
+  if (state["m_bInsuranceOffered"] == 1) return "Insurance?";
+  const auto move = [&enabled](const char* command, const char* name) {
+    return std::string(enabled[command] ? name : "");
+  };
+  return move("32771", "H") + move("32772", "S") + move("32775", "D") + move("32773", "P") +
+         move("32776", "Deal");
+}
+
+}  // namespace
+
+std::string StackOf(const std::string& cards) {
+  const std::string ranks = "A23456789TJQK";
+  const std::string suits = "CDHS";
+  std::string command = "stack";
+  std::istringstream words(cards);
+  for (std::string word; words >> word;) {
+    const std::size_t suit = word.size() > 1 ? suits.find(word[1]) : 0;
+    command += " " + std::to_string(suit * ranks.size() + ranks.find(word[0]) + 1);
+  }
+  return command;
+}
+
+std::string TableLine(const Json& state) {
+  const auto text = [&state](const char* member) { return state[member].get<std::string>(); };
+  std::string line = Dollars(state["m_dWallet"]);
+  for (const std::string& field : {JoinWords({text("m_strPlayerScore"), text("m_strPlayerMsg")}),
+                                   JoinWords({text("m_strSplitScore"), text("m_strSplitMsg")}),
+                                   text("m_strDealerScore"), Flags(state), Moves(state)}) {
+    line += field.empty() ? " |" : " | " + field;
+  }
+  return line;
+}
+
+}  // namespace feltside::tests

@@ -1,0 +1,45 @@
+#pragma once
+
+#include <sys/types.h>
+
+#include <cstdio>
+#include <filesystem>
+#include <nlohmann/json.hpp>
+#include <string>
+
+#include "tests/support/temporary_folder.h"
+
+namespace feltside::tests {
+
+using Json = nlohmann::json;
+
+/// The program as a player meets it: feltside-stylus as a process with a profile of its own.
+///
+/// When it goes, it closes the program's input, and the test fails unless the program then ends
+/// with code 0 and without a word from the sanitizers.
+class Stylus {
+ public:
+  /// Starts the program with this text as its settings' file; without one when it is empty.
+  explicit Stylus(const std::string& profile = {});
+  ~Stylus();
+  Stylus(const Stylus&) = delete;
+  Stylus& operator=(const Stylus&) = delete;
+
+  /// Gives a command and returns its answer; throws when the program has died.
+  Json Send(const std::string& line);
+  Json Tap(int x, int y);
+
+  /// "[Settings]" with these lines in it.
+  void SetSettings(const std::string& lines);
+  std::filesystem::path ProfileFile() const;
+  /// What the program has said on its error stream so far.
+  std::string Errors() const { return ReadFile(m_folder.Path() / "errors"); }
+
+ private:
+  TemporaryFolder m_folder;
+  pid_t m_process = 0;
+  std::FILE* m_pToProgram = nullptr;
+  std::FILE* m_pFromProgram = nullptr;
+};
+
+}  // namespace feltside::tests

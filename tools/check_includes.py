@@ -1,0 +1,147 @@
+#!/usr/bin/env python3
+"""Checks who includes whom: tools/check_includes.py
+
+Holds the folders apart (the game's rules know no window, the layer knows no game) and keeps the
+libraries behind the layer. Names each line that crosses a border; exits with 1 if there is one.
+"""
+
+import re
+import subprocess
+import sys
+from pathlib import Path
+
+ROOT = Path(__file__).resolve().parent.parent
+
+GAME = ("engine/", "render/", "table/", "shell/")
+DRAWING = tuple(f"platform/{name}.h" for name in ("bitmap", "color", "geometry", "surface", "text"))
+
+# The first line whose beginning fits a file holds for it: what of ours it may include, by beginning.
+OURS = [
+    ("engine/", ("engine/", "platform/runtime.h", "platform/message_box.h")),
+    ("render/table_layout", ("render/table_layout.h", "render/picture_ids.h", "engine/") + DRAWING),
+    ("render/picture_ids", DRAWING),
+    ("render/", ("engine/", "render/", "platform/", "table/feltside_view.h")),
+    ("table/", ("engine/", "render/", "table/", "platform/")),
+    ("shell/", GAME + ("platform/",)),
+    ("platform/", ("platform/",)),
+    ("tests/", GAME + ("platform/", "tests/")),
+    ("bench/", GAME + ("platform/", "bench/")),
+    ("fuzz/", GAME + ("platform/", "fuzz/")),
+]
+
+SDL = r"SDL.*"
+SYSTEM = r"(sys/\w+|fcntl|unistd|signal|poll|errno|dirent)\.h"
+GTEST = r"g(test|mock)/g(test|mock).*\.h"
+JSON = r"nlohmann/.*"
+
+# The same for the headers of libraries. The standard library's have neither a dot nor a slash.
+LIBRARIES = [
+    (r"platform/sdl_\w+\.h", SDL),
+    (r"platform/\w+\.cpp", f"{SDL}|toml\\+\\+/.*|{SYSTEM}"),
+    (r"shell/.*", JSON),
+    (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
+    (r"bench/.*", r"benchmark/.*"),
+    (r"fuzz/.*", SYSTEM),
+]
+
+INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
+SDL_NAME = re.compile(r"\b(SDL|TTF|IMG)_\w+")
+
+
+def source_files():
+    """What git knows or would add, as paths from the root."""
+    listed = subprocess.run(
+        ["git", "ls-files", "--cached", "--others", "--exclude-standard", "*.h", "*.cpp"],
+        cwd=ROOT, capture_output=True, text=True, check=True).stdout.split()
+    return sorted(path for path in set(listed) if (ROOT / path).is_file())
+
+
+def includes_of(text):
+    """(line number, own, path) of every include; own: written with quotes."""
+    for number, line in enumerate(text.splitlines(), 1):
+        if match := INCLUDE.match(line):
+            yield number, match[1] == '"', match[2]
+
+
+def may_include_ours(path, included):
+    for beginning, allowed in OURS:
+        if path.startswith(beginning):
+            return included.startswith(allowed)
+    return True
+
+
+def may_include_library(path, included):
+    if re.fullmatch(r"\w+", included):
+        return True
+    return any(re.fullmatch(files, path) and re.fullmatch(allowed, included)
+               for files, allowed in LIBRARIES)
+
+
+def without_comments(text):
+    return re.sub(r"//[^\n]*|/\*.*?\*/", "", text, flags=re.DOTALL)
+
+
+class Checker:
+    def __init__(self):
+        self.texts = {path: (ROOT / path).read_text(encoding="utf-8") for path in source_files()}
+        self.faults = []
+
+    def fault(self, path, number, what):
+        self.faults.append(f"{path}:{number}: {what}")
+
+    def check_includes(self, path, text):
+        for number, own, included in includes_of(text):
+            if not own:
+                if not may_include_library(path, included):
+                    self.fault(path, number, f"may not include the library's <{included}>")
+            elif included not in self.texts:
+                self.fault(path, number, f'no file "{included}" from the root')
+            elif not may_include_ours(path, included):
+                self.fault(path, number, f'may not include "{included}"')
+
+    def check_names(self, path, text):
+        """Even by name SDL is known to the layer alone."""
+        if re.fullmatch(r"platform/(\w+\.cpp|sdl_\w+\.h)", path):
+            return
+        for number, line in enumerate(without_comments(text).splitlines(), 1):
+            if match := SDL_NAME.search(line):
+                self.fault(path, number, f"may not use {match[0]}")
+
+    def reached_from(self, path, seen):
+        """All of our headers that a file includes, through others too."""
+        for _, own, included in includes_of(self.texts[path]):
+            if own and included in self.texts and included not in seen:
+                seen.add(included)
+                self.reached_from(included, seen)
+        return seen
+
+    def check_reach(self, path):
+        """No header of SDL comes to the game through one of the layer's."""
+        if path.startswith("platform/"):
+            return
+        for header in sorted(self.reached_from(path, set())):
+            if any(not own and included.startswith("SDL")
+                   for _, own, included in includes_of(self.texts[header])):
+                self.fault(path, 1, f"is brought SDL by {header}")
+
+    def run(self):
+        for path, text in self.texts.items():
+            self.check_includes(path, text)
+            self.check_names(path, text)
+            self.check_reach(path)
+            if path.endswith(".h") and not re.search(r"^#pragma once$", text, re.MULTILINE):
+                self.fault(path, 1, "has no #pragma once")
+        return self.faults
+
+
+def main():
+    checker = Checker()
+    faults = checker.run()
+    for fault in faults:
+        print(fault)
+    print(f"{len(checker.texts)} files, {len(faults)} of their lines cross a border")
+    return 1 if faults else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())

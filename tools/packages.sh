@@ -1,0 +1,32 @@
+# The packages that Feltside needs, in one place for `play` and `check`.
+#
+# Each line: the Debian package, and how to see on any other system that what it brings is there:
+#   command NAME   a program in the path
+#   module NAME    a module that pkg-config knows
+#   font NAME      a font file where the build looks for it
+#   python NAME    a module that python3 can import
+#   helper NAME    a program that the game starts where there is one, and does without elsewhere
+
+play_packages='
+  cmake                command  cmake
+  ninja-build          command  ninja
+  g++                  command  c++
+  pkg-config           command  pkg-config
+  libsdl2-dev          module   sdl2
+  libsdl2-ttf-dev      module   SDL2_ttf
+  libsdl2-image-dev    module   SDL2_image
+  libtomlplusplus-dev  module   tomlplusplus
+  nlohmann-json3-dev   module   nlohmann_json
+  fonts-liberation     font     LiberationSans-Regular.ttf
+  xdg-utils            helper   xdg-open
+'
+
+check_packages="$play_packages"'
+  clang                command  clang++
+  clang-tidy           command  clang-tidy
+  clang-format         command  clang-format
+  libgtest-dev         module   gtest
+  libgmock-dev         module   gmock
+  python3              command  python3
+  python3-pil          python   PIL
+'
