@@ -79,7 +79,7 @@ SCENES = [
     Scene("dealer", ELEVEN_AGAINST_SIX + [DOUBLE], table(0, 0, 240, 66)),
     Scene("wrong_move", deal(49, 19, 7, 39) + [STAND], table(0, 82, 240, 268)),
     Scene("poker_marked", TWO_PAIR + ["key 5"], settings=VIDEO_POKER),
-    Scene("poker_drawn", TWO_PAIR + ["key 5", "key Enter"], table(0, 206, 240, 268),
+    Scene("poker_drawn", TWO_PAIR + ["key 5", "key Enter"], table(0, 216, 240, 268),
           settings=VIDEO_POKER),
     Scene("poker_plain", deal(28, 18, 50, 24, 13) + ["key 1", "key 2", "key 5"],
           settings=VIDEO_POKER | PLAIN),

@@ -21,8 +21,11 @@ std::string Missing(const Json& actual, const Json& expected) {
 void Follow(Stylus& stylus, const std::vector<Line>& script) {
   for (std::size_t i = 0; i < script.size(); ++i) {
     const Json answer = stylus.Send(script[i].command);
-    EXPECT_EQ(Missing(answer, script[i].expected), "")
-        << "after line " << i + 1 << ": " << script[i].command;
+    SCOPED_TRACE("line " + std::to_string(i + 1) + ": " + script[i].command);
+    EXPECT_EQ(Missing(answer, script[i].expected), "");
+    for (const char* trouble : {"error", "refused"}) {
+      EXPECT_EQ(answer.contains(trouble), script[i].expected.contains(trouble));
+    }
   }
 }
 

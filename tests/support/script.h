@@ -14,7 +14,8 @@ struct Line {
   Json expected = Json::object();
 };
 
-/// Gives the commands one after another and fails the test at every answer that is not as expected.
+/// Gives the commands one after another and fails the test at every answer that is not as expected;
+/// an error or a refusal must be expected too.
 void Follow(Stylus& stylus, const std::vector<Line>& script);
 
 /// What an object lacks or holds otherwise than expected, one difference a line; empty: nothing.

@@ -138,7 +138,7 @@ const std::vector<Hand> kHands = {
       {"H", "100 | 14 | 11 | | | HS"},
       {"refused D", "100 | 14 | 11 | | | HS"},
       {"S", "100 | 14 | 11 | | second | HSD"},
-      {"H", "100 | 14 | 21 | | second | HS"}}},
+      {"H", "100 | 14 Dealer Wins! | 21 Winner! | 17 | second | Deal"}}},
     {"the dealer draws even when both hands have busted",
      "8 8D T 2 5 6 K K 9",
      {{"Deal", "100 | 16 | | | | HSDP"},

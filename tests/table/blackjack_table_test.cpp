@@ -137,6 +137,7 @@ TEST(Adviser, JudgesTheMovesOfTheActiveHand) {
                   {StackOf("6 5 T 6 9")},
                   {kDeal},
                   {kHit, verdict(0)},
+                  {kStand},
                   {StackOf("6 5 T 6 9")},
                   {kDeal},
                   {"command 32775", verdict(1)}});
