@@ -1,6 +1,7 @@
 #!/bin/sh
-# Checks the help pages: valid HTML, no scripts, nothing from outside, every link, anchor and picture
-# there, and a page for each topic that the program names. Needs tidy.
+# Checks the help pages: valid HTML, no scripts, nothing from outside, every link, anchor and
+# picture there, no picture too many, and a page for each topic that the program names. Prints a
+# line for each fault. Needs tidy.
 cd "$(dirname "$0")/.." || exit 1
 faults=0
 for page in help/*.htm; do

@@ -54,12 +54,9 @@ double HandMoney(const Cards& hand, const Cards& dealer, int stake) {
   return mine < theirs ? -stake : 0;
 }
 
-const char* SelectedShoe(const Json& state) {
-  const std::array<const char*, 3> shoes = {"m_deck1", "m_shoe4", "m_shoe6"};
-  return shoes[state["m_nDeckChoice"].get<std::size_t>()];
+bool IsPair(const Cards& hand) {
+  return hand.size() == 2 && hand[0] > 0 && hand[0] % 13 == hand[1] % 13;
 }
-
-bool IsPair(const Cards& hand) { return hand.size() == 2 && hand[0] % 13 == hand[1] % 13; }
 
 /// The commands that may run, by the flags of the state.
 std::string WrongCommands(const Json& s) {
@@ -106,6 +103,11 @@ std::string WrongFlags(const Json& s) {
 }
 
 }  // namespace
+
+const char* SelectedShoe(const Json& state) {
+  const std::array<const char*, 3> shoes = {"m_deck1", "m_shoe4", "m_shoe6"};
+  return shoes[state["m_nDeckChoice"].get<std::size_t>()];
+}
 
 /// Only a deal takes cards while no hand is in progress.
 bool TableModel::WasDealt(const std::string& command, const Json& state) const {

@@ -6,6 +6,9 @@
 
 namespace feltside::tests {
 
+/// The member that holds the shoe which blackjack deals from.
+const char* SelectedShoe(const Json& state);
+
 /// A second opinion on the table: from one state to the next it works out by itself what money the
 /// deal moved, and says where a state cannot be.
 class TableModel {

@@ -153,7 +153,6 @@ TEST(Adviser, JudgesOnlyWhenAskedForAdviceByItsButton) {
                     {"key B", silent},
                     {kSplit, silent},
                     {kHit, silent},
-                    {kStand, silent},
                     {kStand, silent}});
   }
 }
