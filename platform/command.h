@@ -21,8 +21,8 @@ class CCommandTarget {
 /// A line of a target's command map.
 template <class Target>
 struct CommandEntry {
-  int commandID;
-  void (Target::*handler)();
+  int commandID = 0;
+  void (Target::*handler)() = nullptr;
   bool (Target::*isEnabled)() const = nullptr;  ///< null: always
 };
 

@@ -37,10 +37,10 @@ class CCommandBar : public CWindow {
 
  private:
   struct Button {
-    int commandID;
-    int image;
+    int commandID = 0;
+    int image = 0;
     Rect place;
-    bool enabled;
+    bool enabled = false;
   };
   /// What of the bar the stylus is down on.
   enum class Part { kNone, kButton, kClose };

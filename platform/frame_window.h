@@ -14,7 +14,7 @@ namespace platform {
 /// A key that stands for a command.
 struct Accelerator {
   KeyStroke stroke;
-  int commandID;
+  int commandID = 0;
 };
 
 /// The main window: a command bar above, the view below. It hands commands to whoever knows them:

@@ -53,7 +53,7 @@ fs::path HelpPage(const std::string& commandLine) {
   const fs::path folder = HelpFolder();
   std::error_code error;
   if (anchor != std::string::npos) {
-    const fs::path topic =
+    fs::path topic =
         folder / (fs::path(page).stem().string() + "-" + target.substr(anchor + 1) + ".htm");
     if (fs::is_regular_file(topic, error)) return topic;
   }

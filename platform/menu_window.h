@@ -42,7 +42,7 @@ class CMenuWindow : public CTopWindow {
   struct Line {
     MenuItem item;
     Rect place;
-    bool enabled;
+    bool enabled = false;
   };
 
   static Rect PlaceOf(const MenuTemplate& menu, Point at);

@@ -2,6 +2,7 @@
 
 #include <SDL_image.h>
 
+#include <cstddef>
 #include <memory>
 
 #include "platform/resources.h"
@@ -19,8 +20,9 @@ std::optional<CBitmap> ToBitmap(SDL_Surface* decoded) {
   if (pixels == nullptr) return std::nullopt;
   CBitmap bitmap({pixels->w, pixels->h});
   for (int y = 0; y < pixels->h; ++y) {
-    const auto* row = reinterpret_cast<const Pixel*>(static_cast<const Uint8*>(pixels->pixels) +
-                                                     y * pixels->pitch);
+    const auto offset = static_cast<std::ptrdiff_t>(y) * pixels->pitch;
+    const auto* row =
+        reinterpret_cast<const Pixel*>(static_cast<const Uint8*>(pixels->pixels) + offset);
     for (int x = 0; x < pixels->w; ++x) bitmap.At({x, y}) = row[x];
   }
   return bitmap;

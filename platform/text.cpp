@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
 #include <cstdlib>
 #include <memory>
 
@@ -84,7 +85,8 @@ void Strike(const SDL_Surface& glyphs, int shift, CBitmap& stencil) {
   const int height = std::min(glyphs.h, stencil.GetSize().height);
   const int width = std::min(glyphs.w, stencil.GetSize().width - shift);
   for (int y = 0; y < height; ++y) {
-    const auto* row = static_cast<const Uint8*>(glyphs.pixels) + y * glyphs.pitch;
+    const auto offset = static_cast<std::ptrdiff_t>(y) * glyphs.pitch;
+    const auto* row = static_cast<const Uint8*>(glyphs.pixels) + offset;
     for (int x = 0; x < width; ++x) {
       if (row[x] != 0) stencil.At({x + shift, y}) = ToPixel(kBlack);
     }

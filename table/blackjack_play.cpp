@@ -80,11 +80,9 @@ void CFeltsideView::Hit() {
   if (total > kTwentyOne) (playingSplit ? m_strSplitMsg : m_strPlayerMsg) = "Bust";
   if (total < kTwentyOne) {
     Repaint();
-  } else if (playingSplit) {
-    DealerPlay();
-  } else if (IsSplit()) {
+  } else if (!playingSplit && IsSplit()) {
     PlaySplitHand();
-  } else if (total > kTwentyOne) {
+  } else if (!playingSplit && total > kTwentyOne) {
     Settle();
   } else {
     DealerPlay();
