@@ -29,23 +29,26 @@ CBitmap DifferenceOf(const CBitmap& actual, const CBitmap& stored, int& count) {
 
 }  // namespace
 
-void ExpectGolden(const CBitmap& actual, const std::string& name) {
-  const fs::path golden = fs::path(FELTSIDE_GOLDEN_FOLDER) / (name + ".png");
-  const char* renew = std::getenv("FELTSIDE_RENEW_GOLDEN");
-  if (renew != nullptr && std::string(renew) == "1") {
-    ASSERT_TRUE(platform::SavePng(actual, golden.string())) << golden;
-    return;
-  }
-  const CBitmap stored = platform::LoadPng(golden.string()).value_or(CBitmap());
-  if (stored == actual) return;
+void ExpectSame(const CBitmap& actual, const CBitmap& expected, const std::string& name) {
+  if (expected == actual) return;
   int count = 0;
   const fs::path folder = FELTSIDE_DIFFERENCE_FOLDER;
   fs::create_directories(folder);
   platform::SavePng(actual, (folder / (name + ".actual.png")).string());
-  platform::SavePng(DifferenceOf(actual, stored, count),
+  platform::SavePng(DifferenceOf(actual, expected, count),
                     (folder / (name + ".difference.png")).string());
-  ADD_FAILURE() << count << " pixels differ from " << golden << ": see " << folder
-                << ", or renew the picture with FELTSIDE_RENEW_GOLDEN=1";
+  ADD_FAILURE() << name << ": " << count << " pixels differ; see " << folder;
+}
+
+void ExpectGolden(const CBitmap& actual, const std::string& name) {
+  const std::string golden = (fs::path(FELTSIDE_GOLDEN_FOLDER) / (name + ".png")).string();
+  const char* renew = std::getenv("FELTSIDE_RENEW_GOLDEN");
+  if (renew != nullptr && std::string(renew) == "1") {
+    ASSERT_TRUE(platform::SavePng(actual, golden)) << golden;
+    return;
+  }
+  SCOPED_TRACE("stored as " + golden + "; FELTSIDE_RENEW_GOLDEN=1 renews it");
+  ExpectSame(actual, platform::LoadPng(golden).value_or(CBitmap()), name);
 }
 
 }  // namespace feltside::tests

@@ -6,9 +6,13 @@
 
 namespace feltside::tests {
 
-/// Fails the test where a picture differs from the stored one of that name, and leaves both and
-/// their difference in the folder golden-diff of the build. With FELTSIDE_RENEW_GOLDEN=1 in the
-/// environment it stores the picture instead.
+/// Fails the test where two pictures differ, and leaves the actual one and the difference under
+/// this name in the folder golden-diff of the build.
+void ExpectSame(const platform::CBitmap& actual, const platform::CBitmap& expected,
+                const std::string& name);
+
+/// The same with the stored picture of that name. With FELTSIDE_RENEW_GOLDEN=1 in the environment
+/// it stores the picture instead.
 void ExpectGolden(const platform::CBitmap& actual, const std::string& name);
 
 }  // namespace feltside::tests

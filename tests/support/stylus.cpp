@@ -10,6 +10,8 @@
 #include <memory>
 #include <stdexcept>
 
+#include "platform/resources.h"
+
 namespace feltside::tests {
 namespace {
 
@@ -68,6 +70,12 @@ Json Stylus::Tap(int x, int y) {
 
 void Stylus::SetSettings(const std::string& lines) {
   WriteFile(ProfileFile(), "[Settings]\n" + lines + "\n");
+}
+
+platform::CBitmap Stylus::Shot() {
+  const std::string file = m_folder.Path() / "shot.png";
+  Send("shot " + file);
+  return platform::LoadPng(file).value();
 }
 
 std::filesystem::path Stylus::ProfileFile() const {

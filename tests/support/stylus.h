@@ -7,6 +7,7 @@
 #include <nlohmann/json.hpp>
 #include <string>
 
+#include "platform/bitmap.h"
 #include "tests/support/temporary_folder.h"
 
 namespace feltside::tests {
@@ -32,6 +33,8 @@ class Stylus {
   /// "[Settings]" with these lines in it.
   void SetSettings(const std::string& lines);
   std::filesystem::path ProfileFile() const;
+  /// The whole window.
+  platform::CBitmap Shot();
   /// What the program has said on its error stream so far.
   std::string Errors() const { return ReadFile(m_folder.Path() / "errors"); }
 
