@@ -37,7 +37,7 @@ class CBitmap {
   Rect Bounds() const { return RectAt({}, m_size); }
   /// The pixel at a place that must lie within Bounds().
   Pixel& At(Point p) { return m_arrPixels[Index(p)]; }
-  Pixel At(Point p) const { return m_arrPixels[Index(p)]; }
+  const Pixel& At(Point p) const { return m_arrPixels[Index(p)]; }
   const std::vector<Pixel>& Pixels() const { return m_arrPixels; }
 
   friend bool operator==(const CBitmap&, const CBitmap&) = default;

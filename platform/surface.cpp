@@ -4,6 +4,10 @@
 #include <utility>
 
 namespace platform {
+namespace {
+/// What is copied is never see-through.
+constexpr Pixel kOpaqueBits = 0xFF000000U;
+}  // namespace
 
 CSurface::CSurface(CBitmap& target) : CSurface(target, target.Bounds()) {}
 
@@ -19,22 +23,30 @@ BackMode CSurface::SetBackMode(BackMode mode) { return std::exchange(m_state.bac
 Color CSurface::SetBrush(Color color) { return std::exchange(m_state.brush, color); }
 Color CSurface::SetPen(Color color) { return std::exchange(m_state.pen, color); }
 
+Rect CSurface::Visible(const Rect& rect) const {
+  return rect.Moved(m_part.TopLeft()).Common(m_part).Common(m_pTarget->Bounds());
+}
+
 /// Calls the rule with each pixel of the rectangle that the target has, and its place on this
 /// surface.
 template <class PixelRule>
 void CSurface::EachPixel(const Rect& rect, PixelRule rule) {
-  const Point origin = m_part.TopLeft();
-  const Rect visible = rect.Moved(origin).Common(m_part).Common(m_pTarget->Bounds());
+  const Rect visible = Visible(rect);
   for (int y = visible.top; y < visible.bottom; ++y) {
     for (int x = visible.left; x < visible.right; ++x) {
-      rule(m_pTarget->At({x, y}), Point{x, y} - origin);
+      rule(m_pTarget->At({x, y}), Point{x, y} - m_part.TopLeft());
     }
   }
 }
 
+// Filling and copying are most of a frame's work, so they go by whole rows.
+
 void CSurface::FillRect(const Rect& rect, Color color) {
-  const Pixel pixel = ToPixel(color);
-  EachPixel(rect, [pixel](Pixel& target, Point) { target = pixel; });
+  const Rect visible = Visible(rect);
+  if (visible.IsEmpty()) return;
+  for (int y = visible.top; y < visible.bottom; ++y) {
+    std::fill_n(&m_pTarget->At({visible.left, y}), visible.Width(), ToPixel(color));
+  }
 }
 
 void CSurface::Rectangle(const Rect& rect) {
@@ -51,12 +63,20 @@ void CSurface::Line(Point from, Point to) {
 }
 
 void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt, RasterOp op) {
-  const Point shift = sourceAt - at;
-  EachPixel(RectAt(at, size), [&](Pixel& target, Point p) {
-    if (!source.Bounds().Contains(p + shift)) return;
-    const Pixel pixel = source.At(p + shift) | 0xFF000000U;
-    target = op == RasterOp::kAnd ? target & pixel : pixel;
-  });
+  const Point shift = at - sourceAt;
+  const Rect visible = Visible(RectAt(at, size).Common(source.Bounds().Moved(shift)));
+  if (visible.IsEmpty()) return;
+  const Point toSource = Point{} - shift - m_part.TopLeft();
+  for (int y = visible.top; y < visible.bottom; ++y) {
+    const Pixel* from = &source.At(Point{visible.left, y} + toSource);
+    Pixel* to = &m_pTarget->At({visible.left, y});
+    if (op == RasterOp::kAnd) {
+      std::transform(from, from + visible.Width(), to, to,
+                     [](Pixel a, Pixel b) { return (a | kOpaqueBits) & b; });
+    } else {
+      std::transform(from, from + visible.Width(), to, [](Pixel a) { return a | kOpaqueBits; });
+    }
+  }
 }
 
 void CSurface::StretchBlt(const Rect& to, const CBitmap& source, const Rect& from) {
@@ -64,7 +84,7 @@ void CSurface::StretchBlt(const Rect& to, const CBitmap& source, const Rect& fro
   EachPixel(to, [&](Pixel& target, Point p) {
     const Point sample{from.left + (p.x - to.left) * from.Width() / to.Width(),
                        from.top + (p.y - to.top) * from.Height() / to.Height()};
-    if (source.Bounds().Contains(sample)) target = source.At(sample) | 0xFF000000U;
+    if (source.Bounds().Contains(sample)) target = source.At(sample) | kOpaqueBits;
   });
 }
 

@@ -67,6 +67,8 @@ class CSurface {
 
  private:
   friend class SavedState;
+  /// The part of a rectangle that the target has, in the target's pixels.
+  Rect Visible(const Rect& rect) const;
   template <class PixelRule>
   void EachPixel(const Rect& rect, PixelRule rule);
 

@@ -117,7 +117,7 @@ int CStylus::Run() {
     Json state = State();
     state["running"] = false;
     state["exit"] = exitCode;
-    m_out << state.dump() << std::endl;
+    Answer(state);
   }
   return exitCode;
 }
@@ -127,7 +127,7 @@ bool CStylus::OnIdle() {
     m_bAnswerDue = false;
     Json answer = m_bWithState ? State() : Json::object();
     answer.update(m_answer);
-    m_out << answer.dump() << std::endl;
+    Answer(answer);
   }
   std::string line;
   do {
@@ -135,6 +135,11 @@ bool CStylus::OnIdle() {
   } while (line.empty() || line[0] == '#');
   Interpret(line);
   return true;
+}
+
+/// One line, at once. Bytes of a malformed command that are not UTF-8 are shown as replaced.
+void CStylus::Answer(const Json& answer) {
+  m_out << answer.dump(-1, ' ', false, Json::error_handler_t::replace) << std::endl;
 }
 
 void CStylus::Interpret(const std::string& line) {

@@ -34,6 +34,7 @@ class CStylus {
   static const std::vector<Command>& Commands();
 
   bool OnIdle();
+  void Answer(const Json& answer);
   void Interpret(const std::string& line);
   Json State();
   Json EnabledCommands() const;

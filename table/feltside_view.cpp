@@ -50,7 +50,22 @@ CShoe* CFeltsideView::SelectedShoe() {
 
 int CFeltsideView::NextCard() {
   CShoe* shoe = SelectedShoe();
-  return shoe == nullptr ? kNoCard : shoe->TakeCard();
+  return shoe == nullptr ? kNoCard : DrawFrom(*shoe);
+}
+
+int CFeltsideView::DrawFrom(CShoe& shoe) {
+  int card = shoe.TakeCard();
+  if (card != kNoCard) return card;
+  shoe.Shuffle();
+  do {
+    card = shoe.TakeCard();
+  } while (IsOnTable(card));
+  return card;
+}
+
+bool CFeltsideView::IsOnTable(int card) const {
+  if (m_nGameType == kGameVideoPoker) return m_handPoker.Contains(card);
+  return m_handPlayer.Contains(card) || m_handSplit.Contains(card) || m_handDealer.Contains(card);
 }
 
 void CFeltsideView::PrepareShoe() {

@@ -79,6 +79,10 @@ class CFeltsideView : public platform::CView {
   void LowerBet();
   void PlaySplitHand();
   int NextCard();
+  /// A shoe's next card. When it has run out in the middle of a deal, all cards but those that lie
+  /// on the table are shuffled first, as a dealer would.
+  int DrawFrom(CShoe& shoe);
+  bool IsOnTable(int card) const;
   void PrepareShoe();
   /// The shoe that blackjack deals from; null for a deck choice outside 0..2.
   CShoe* SelectedShoe();

@@ -25,7 +25,7 @@ void CFeltsideView::DealVideoPoker() {
   m_layout.m_nRowCards = kPokerCards;
   m_handPoker.Clear();
   for (int i = 0; i < kPokerCards; ++i) {
-    const int card = m_deck1.TakeCard();
+    const int card = DrawFrom(m_deck1);
     if (!IsCard(card)) platform::MessageBox(std::to_string(card) + " is being put in!");
     m_handPoker.AddCard(card);
   }
@@ -50,7 +50,7 @@ void CFeltsideView::DrawVideoPoker() {
     if (m_bDiscard[static_cast<std::size_t>(slot)] == 0) continue;
     discarded += m_handPoker.RemoveCard(m_handPoker.GetCard(slot));
   }
-  for (int i = 0; i < discarded; ++i) m_handPoker.AddCard(m_deck1.TakeCard());
+  for (int i = 0; i < discarded; ++i) m_handPoker.AddCard(DrawFrom(m_deck1));
   m_bDiscard.fill(0);
   m_dWallet += ScorePoker(m_handPoker, m_strPlayerMsg);
   m_bHandInProgress = 0;

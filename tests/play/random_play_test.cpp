@@ -12,7 +12,7 @@
 namespace feltside::tests {
 namespace {
 
-constexpr int kCommands = 15000;
+constexpr int kCommands = 50000;
 
 /// A person without a plan, the same one for the same seed.
 class Player {
