@@ -39,6 +39,8 @@ class CBitmap {
   Pixel& At(Point p) { return m_arrPixels[Index(p)]; }
   const Pixel& At(Point p) const { return m_arrPixels[Index(p)]; }
   const std::vector<Pixel>& Pixels() const { return m_arrPixels; }
+  /// The first pixel, for whoever fills the whole block at once.
+  Pixel* Data() { return m_arrPixels.data(); }
 
   friend bool operator==(const CBitmap&, const CBitmap&) = default;
 

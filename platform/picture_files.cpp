@@ -1,49 +1,54 @@
-// Decoding and writing of picture files.
+// Decoding and writing of PNG pictures.
 
-#include <SDL_image.h>
+#include <png.h>
 
-#include <cstddef>
-#include <memory>
+#include <bit>
 
 #include "platform/resources.h"
 
 namespace platform {
 namespace {
 
-using SurfacePtr = std::unique_ptr<SDL_Surface, decltype(&SDL_FreeSurface)>;
+/// Our pixels are 0xAARRGGBB in memory order of this machine.
+constexpr png_uint_32 kPixelFormat =
+    std::endian::native == std::endian::little ? PNG_FORMAT_BGRA : PNG_FORMAT_ARGB;
 
-std::optional<CBitmap> ToBitmap(SDL_Surface* decoded) {
-  const SurfacePtr owned(decoded, &SDL_FreeSurface);
-  if (owned == nullptr) return std::nullopt;
-  const SurfacePtr pixels(SDL_ConvertSurfaceFormat(owned.get(), SDL_PIXELFORMAT_ARGB8888, 0),
-                          &SDL_FreeSurface);
-  if (pixels == nullptr) return std::nullopt;
-  CBitmap bitmap({pixels->w, pixels->h});
-  for (int y = 0; y < pixels->h; ++y) {
-    const auto offset = static_cast<std::ptrdiff_t>(y) * pixels->pitch;
-    const auto* row =
-        reinterpret_cast<const Pixel*>(static_cast<const Uint8*>(pixels->pixels) + offset);
-    for (int x = 0; x < pixels->w; ++x) bitmap.At({x, y}) = row[x];
-  }
+png_image StartImage() {
+  png_image image{};
+  image.version = PNG_IMAGE_VERSION;
+  return image;
+}
+
+/// Reads the pixels of a picture whose head has been read; the library frees what it holds of it.
+std::optional<CBitmap> FinishReading(png_image& image) {
+  image.format = kPixelFormat;
+  CBitmap bitmap({static_cast<int>(image.width), static_cast<int>(image.height)});
+  const int read = png_image_finish_read(&image, nullptr, bitmap.Data(),
+                                         static_cast<png_int_32>(image.width) * 4, nullptr);
+  if (read == 0) return std::nullopt;
   return bitmap;
 }
 
 }  // namespace
 
 std::optional<CBitmap> DecodePicture(const EmbeddedFile& file) {
-  return ToBitmap(IMG_Load_RW(SDL_RWFromConstMem(file.data, static_cast<int>(file.size)), 1));
+  png_image image = StartImage();
+  if (png_image_begin_read_from_memory(&image, file.data, file.size) == 0) return std::nullopt;
+  return FinishReading(image);
+}
+
+std::optional<CBitmap> LoadPng(const std::string& path) {
+  png_image image = StartImage();
+  if (png_image_begin_read_from_file(&image, path.c_str()) == 0) return std::nullopt;
+  return FinishReading(image);
 }
 
 bool SavePng(const CBitmap& bitmap, const std::string& path) {
-  std::vector<Pixel> pixels = bitmap.Pixels();
-  const Size size = bitmap.GetSize();
-  const SurfacePtr surface(
-      SDL_CreateRGBSurfaceWithFormatFrom(pixels.data(), size.width, size.height, 32, size.width * 4,
-                                         SDL_PIXELFORMAT_ARGB8888),
-      &SDL_FreeSurface);
-  return surface != nullptr && IMG_SavePNG(surface.get(), path.c_str()) == 0;
+  png_image image = StartImage();
+  image.width = static_cast<png_uint_32>(bitmap.GetSize().width);
+  image.height = static_cast<png_uint_32>(bitmap.GetSize().height);
+  image.format = kPixelFormat;
+  return png_image_write_to_file(&image, path.c_str(), 0, bitmap.Pixels().data(), 0, nullptr) != 0;
 }
-
-std::optional<CBitmap> LoadPng(const std::string& path) { return ToBitmap(IMG_Load(path.c_str())); }
 
 }  // namespace platform

@@ -14,7 +14,7 @@ play_packages='
   pkg-config           command  pkg-config
   libsdl2-dev          module   sdl2
   libsdl2-ttf-dev      module   SDL2_ttf
-  libsdl2-image-dev    module   SDL2_image
+  libpng-dev           module   libpng
   libtomlplusplus-dev  module   tomlplusplus
   nlohmann-json3-dev   module   nlohmann_json
   fonts-liberation     font     LiberationSans-Regular.ttf
