@@ -5,7 +5,6 @@ namespace feltside {
 namespace {
 
 constexpr int kAceRaise = 10;  // what an ace counted as 11 adds to an ace counted as 1
-constexpr int kBestTotal = 21;
 
 }  // namespace
 
@@ -19,7 +18,7 @@ int CBlackjackHand::IsPair() const {
 }
 
 int CBlackjackHand::IsSoft() const {
-  return HasAce() && HardTotal() + kAceRaise <= kBestTotal ? 1 : 0;
+  return HasAce() && HardTotal() + kAceRaise <= kTwentyOne ? 1 : 0;
 }
 
 int CBlackjackHand::HardTotal() const {

@@ -4,6 +4,9 @@
 
 namespace feltside {
 
+/// The best total of a hand; more is a bust.
+inline constexpr int kTwentyOne = 21;
+
 /// A hand that knows what it is worth in blackjack. It starts with a limit of five cards.
 class CBlackjackHand : public CCardHand {
  public:

@@ -27,8 +27,8 @@ class CShoe {
   int TakeCard();
 
   /// For trying out hands: puts these cards into the last slots and deals them next. The shoe then
-  /// stands so near its end that a deal does not reshuffle it. More cards than the shoe has slots
-  /// change nothing.
+  /// stands at its end, so that a deal of at most so many cards does not shuffle it anew. More
+  /// cards than the shoe has slots change nothing.
   void StackTop(const std::vector<int>& cards);
 
   int GetPosition() const { return m_nNext; }  ///< slot of the next card; the count when exhausted

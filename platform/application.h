@@ -27,6 +27,8 @@ class CApplication : public CCommandTarget {
   /// Starts the program, runs it to its end and answers the exit code.
   int Main();
 
+  /// Also the title of message boxes and the name of the settings' file.
+  const std::string& Name() const { return m_strName; }
   CMessageQueue& Queue() { return m_queue; }
   CScreen& Screen() { return m_screen; }
   CResources& Resources() { return m_resources; }

@@ -24,7 +24,7 @@ class CComboBox : public CControl {
   void SetCurSel(int item);
   /// Chooses an item as the person does: the dialog is told when the choice changed.
   void Choose(int item);
-  /// Drops the list, or closes it.
+  /// Drops the list.
   void Activate() override;
 
   void OnPaint(CSurface& surface) override;

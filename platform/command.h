@@ -9,7 +9,7 @@ enum class CommandState {
   kEnabled,
 };
 
-/// Something that handles commands: the view, the document, the frame, the application.
+/// Something that handles commands: the view, the frame, the application.
 class CCommandTarget {
  public:
   virtual ~CCommandTarget() = default;

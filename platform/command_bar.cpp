@@ -155,12 +155,16 @@ void CCommandBar::OnMouseMove(Point p) {
   Invalidate();
 }
 
-void CCommandBar::OnLButtonUp(Point p) {
-  OnMouseMove(p);
-  const Part released = m_bStylusInside ? m_pressed : Part::kNone;
+void CCommandBar::OnPressLost() {
   m_pressed = Part::kNone;
   m_bStylusInside = false;
   Invalidate();
+}
+
+void CCommandBar::OnLButtonUp(Point p) {
+  OnMouseMove(p);
+  const Part released = m_bStylusInside ? m_pressed : Part::kNone;
+  OnPressLost();
   if (released == Part::kClose) TheApp().Queue().Post({MessageKind::kClose, {}, 0, 0});
   if (released == Part::kButton) {
     TheApp().Queue().PostCommand(m_arrButtons[m_nPressedButton].commandID);

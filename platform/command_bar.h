@@ -34,6 +34,7 @@ class CCommandBar : public CWindow {
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
   void OnLButtonUp(Point p) override;
+  void OnPressLost() override;
 
  private:
   struct Button {

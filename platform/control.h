@@ -36,7 +36,7 @@ class CControl : public CWindow {
 
  protected:
   CDialog& Dialog() const { return m_dialog; }
-  /// The way input may change a control only while it can be seen and is enabled.
+  /// Gives the keyboard to this control.
   void TakeFocus();
 
  private:

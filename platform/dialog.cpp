@@ -84,6 +84,9 @@ void CDialog::MakeControls(const DialogTemplate& form) {
 }
 
 int CDialog::DoModal() {
+  CTopWindow* below = TheApp().Screen().Top();
+  CWindow* focusBelow = below == nullptr ? nullptr : below->GetFocus();
+  if (focusBelow != nullptr) focusBelow->OnFocus(false);
   {
     const DeadBackground dead;
     Open();
@@ -92,6 +95,7 @@ int CDialog::DoModal() {
   }
   SetFocus(nullptr);
   Close();
+  if (focusBelow != nullptr) focusBelow->OnFocus(true);
   return m_bEnded ? m_nResult : kResultCancel;
 }
 

@@ -64,6 +64,7 @@ class CDialog : public CTopWindow {
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
   void OnLButtonUp(Point p) override;
+  void OnPressLost() override { m_bMoving = false; }
   bool OnKeyDown(const KeyStroke& stroke) override;
 
  protected:

@@ -10,8 +10,9 @@
 namespace platform {
 
 /// What a program's one document holds. A new document starts empty.
-class CDocument : public CCommandTarget {
+class CDocument {
  public:
+  virtual ~CDocument() = default;
   /// Empties the document; false when that fails.
   virtual bool OnNewDocument() { return true; }
 };
@@ -35,7 +36,6 @@ class CSingleDocTemplate {
   bool OpenNewDocument();
 
   CFrameWindow* Frame() const { return m_pFrame.get(); }
-  CDocument* Document() const { return m_pDocument.get(); }
 
  private:
   bool BuildFrame();

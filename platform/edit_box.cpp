@@ -66,12 +66,9 @@ void CEditBox::OnPaint(CSurface& surface) {
 }
 
 std::size_t CEditBox::PlaceAt(int x) const {
-  std::size_t best = 0;
-  for (std::size_t at = 0; at < GetText().size();) {
-    at = NextLetter(GetText(), at);
-    if (std::abs(CaretX(at) - x) < std::abs(CaretX(best) - x)) best = at;
-  }
-  return best;
+  const std::size_t before = FittingLength(kSystemFont, GetText(), x - CaretX(0));
+  const std::size_t after = NextLetter(GetText(), before);
+  return std::abs(CaretX(after) - x) < std::abs(CaretX(before) - x) ? after : before;
 }
 
 void CEditBox::OnLButtonDown(Point p) {
@@ -93,6 +90,9 @@ void CEditBox::ScrollToCaret() {
   const int x = CaretX(m_nCaret);
   if (x < left) m_nScroll -= left - x;
   if (x > right) m_nScroll += x - right;
+  // No blank room at the end while letters are hidden at the start.
+  const int width = MeasureText(kSystemFont, GetText()).width;
+  m_nScroll = std::clamp(m_nScroll, 0, std::max(0, width - (right - left)));
   Invalidate();
 }
 

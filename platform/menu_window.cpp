@@ -117,16 +117,25 @@ bool CMenuWindow::OnKeyDown(const KeyStroke& stroke) {
   return true;
 }
 
+/// Chooses the only item that a letter stands for; of several, moves on to the next.
 bool CMenuWindow::ChooseByLetter(char letter) {
-  for (std::size_t i = 0; i < m_arrLines.size(); ++i) {
-    const std::string& text = m_arrLines[i].item.text;
-    const char mnemonic = MnemonicOf(text);
-    if (letter != 0 && (mnemonic != 0 ? mnemonic == letter : text.substr(0, 1)[0] == letter)) {
-      Choose(static_cast<int>(i));
-      return true;
-    }
+  const int count = static_cast<int>(m_arrLines.size());
+  std::vector<int> matches;
+  for (int i = 1; i <= count; ++i) {
+    const int line = (m_nSelected + i + count) % count;
+    if (IsFor(m_arrLines[static_cast<std::size_t>(line)], letter)) matches.push_back(line);
   }
-  return false;
+  if (matches.empty()) return false;
+  Select(matches.front());
+  if (matches.size() == 1) Choose(matches.front());
+  return true;
+}
+
+/// A letter stands for an enabled item that marks it, or that marks none and begins with it.
+bool CMenuWindow::IsFor(const Line& line, char letter) {
+  if (letter == 0 || !line.enabled || line.item.text.empty()) return false;
+  const char mnemonic = MnemonicOf(line.item.text);
+  return letter == (mnemonic != 0 ? mnemonic : line.item.text[0]);
 }
 
 void CMenuWindow::Choose(int line) {

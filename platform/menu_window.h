@@ -52,6 +52,7 @@ class CMenuWindow : public CTopWindow {
   void Select(int line);
   void Step(int direction);
   bool ChooseByLetter(char letter);
+  static bool IsFor(const Line& line, char letter);
   void Choose(int line);
   void Dismiss();
 

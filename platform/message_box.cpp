@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/application.h"
 #include "platform/dialog.h"
 #include "platform/look.h"
 #include "platform/wrapped_text.h"
@@ -24,7 +25,7 @@ DialogTemplate FormFor(const std::string& text, MessageBoxButtons buttons) {
     return ControlTemplate{
         kind, static_cast<int>(result), label, {x, buttonTop, kButton.width, kButton.height}};
   };
-  DialogTemplate form{"Feltside", kWidth, buttonTop + kButton.height + kMargin, {}};
+  DialogTemplate form{TheApp().Name(), kWidth, buttonTop + kButton.height + kMargin, {}};
   form.controls.push_back({ControlKind::kStatic,
                            kNoControlID,
                            text,

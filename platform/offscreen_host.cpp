@@ -9,10 +9,6 @@ void OffscreenHost::Show(const CBitmap& frame) {
   if (m_onFrame) m_onFrame(frame);
 }
 
-void OffscreenHost::SetIdentity(const std::string& title, const std::optional<CBitmap>&) {
-  m_strTitle = title;
-}
-
 bool OffscreenHost::NextEvent(InputEvent& event) {
   if (m_arrInput.empty()) return false;
   event = m_arrInput.front();

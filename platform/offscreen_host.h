@@ -27,12 +27,11 @@ class OffscreenHost : public Host {
   }
 
   const CBitmap& Shown() const { return m_shown; }
-  const std::string& Title() const { return m_strTitle; }
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
   bool WantsText() const { return m_bWantsText; }
 
   void Show(const CBitmap& frame) override;
-  void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override;
+  void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
   bool NextEvent(InputEvent& event) override;
   void WaitEvent(int milliseconds) override;
   std::int64_t Ticks() override { return m_nTicks; }
@@ -54,7 +53,6 @@ class OffscreenHost : public Host {
   LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then
   CBitmap m_shown;
-  std::string m_strTitle;
   std::string m_strClipboard;
   std::vector<std::string> m_arrHelpCalls;
   bool m_bWantsText = false;

@@ -15,6 +15,11 @@ void CPressControl::OnMouseMove(Point p) {
   Invalidate();
 }
 
+void CPressControl::OnPressLost() {
+  m_bPressed = false;
+  Invalidate();
+}
+
 void CPressControl::OnLButtonUp(Point p) {
   m_bPressed = false;
   Invalidate();

@@ -13,6 +13,7 @@ class CPressControl : public CControl {
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
   void OnLButtonUp(Point p) override;
+  void OnPressLost() override;
 
  protected:
   bool IsPressed() const { return m_bPressed; }

@@ -51,13 +51,20 @@ fs::path NameForDamaged(const fs::path& file) {
   return name;
 }
 
+void TellWhereKept(const fs::path& file, const fs::path& kept, const std::error_code& error) {
+  std::cerr << "The settings in " << file << " cannot be understood; ";
+  if (error) {
+    std::cerr << "they cannot be kept as " << kept << " (" << error.message() << ").\n";
+  } else {
+    std::cerr << "they are kept as " << kept << " and the defaults hold.\n";
+  }
+}
+
 void SetAside(const fs::path& file) {
   const fs::path kept = NameForDamaged(file);
   std::error_code error;
   fs::rename(file, kept, error);
-  if (error) return;
-  std::cerr << "The settings in " << file << " cannot be understood; they are kept as " << kept
-            << " and the defaults hold.\n";
+  TellWhereKept(file, kept, error);
 }
 
 fs::path LockOf(const fs::path& file) { return file.string() + ".lock"; }
@@ -80,8 +87,10 @@ ReadProfile ReadUnlocked(const fs::path& file) {
 
 /// Keeps a copy of a file in which something other than a section stands where one must be written.
 void KeepCopy(const fs::path& file) {
+  const fs::path kept = NameForDamaged(file);
   std::error_code error;
-  fs::copy_file(file, NameForDamaged(file), error);
+  fs::copy_file(file, kept, error);
+  TellWhereKept(file, kept, error);
 }
 
 /// Strings as plain quoted ones: in the other forms some line ends do not come back as they were.
@@ -93,7 +102,12 @@ std::string Format(const toml::table& values) {
 
 }  // namespace
 
-CProfile::CProfile(fs::path file) : m_file(std::move(file)) {}
+CProfile::CProfile(fs::path file) : m_file(std::move(file)) {
+  // What a symbolic link leads to is replaced, not the link.
+  std::error_code error;
+  const fs::path target = fs::weakly_canonical(m_file, error);
+  if (!error) m_file = target;
+}
 
 int CProfile::GetInt(const std::string& section, const std::string& entry, int absent) const {
   const ReadProfile profile = ReadUnlocked(m_file);

@@ -43,7 +43,9 @@ const CBitmap& CResources::Load(const std::string& kind, int resourceID, Size bl
   if (loaded != m_mapLoaded.end()) return loaded->second;
   std::optional<CBitmap> picture;
   for (const EmbeddedFile& file : m_files) {
-    if (StartsWith(file.name, prefix)) picture = DecodePicture(file);
+    if (!StartsWith(file.name, prefix)) continue;
+    picture = DecodePicture(file);
+    break;
   }
   return m_mapLoaded.emplace(prefix, picture ? *picture : Blank(blank, resourceID)).first->second;
 }

@@ -16,7 +16,7 @@ class CResources {
   explicit CResources(EmbeddedFiles files) : m_files(files) {}
 
   /// The bitmap of that number. Where there is none, or it cannot be decoded: a framed blank of the
-  /// given size that bears the number.
+  /// given size that bears the number, the same from then on.
   const CBitmap& LoadBitmap(int resourceID, Size blank);
   /// The icon of that number, with the same rule.
   const CBitmap& LoadIcon(int resourceID, Size blank);

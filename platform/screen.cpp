@@ -1,12 +1,11 @@
 #include "platform/screen.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/host.h"
 
 namespace platform {
-
-CScreen::CScreen() : m_pixels(kSize) {}
 
 void CScreen::Push(CTopWindow& window) {
   m_arrWindows.push_back(&window);
@@ -75,13 +74,26 @@ void CScreen::PaintAll() {
 }
 
 void CScreen::Present() {
-  if (!m_bStale) return;
+  if (!m_bStale || m_arrWindows.empty()) return;
   m_bStale = false;
-  CSurface surface(m_pixels);
+  if (m_arrWindows.size() == 1) {
+    TheHost().Show(Top()->Pixels());
+    return;
+  }
+  CBitmap pixels(kSize);
+  CSurface surface(pixels);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
-  TheHost().Show(m_pixels);
+  TheHost().Show(pixels);
+}
+
+void CScreen::TakePressFrom(const CWindow& window) {
+  for (const CWindow* at = m_pPressed; at != nullptr; at = at->GetParent()) {
+    if (at != &window) continue;
+    std::exchange(m_pPressed, nullptr)->OnPressLost();
+    return;
+  }
 }
 
 void CScreen::Forget(CWindow& window) {

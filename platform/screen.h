@@ -13,8 +13,6 @@ class CScreen {
   /// The whole window's size in pixels.
   static constexpr Size kSize{240, 294};
 
-  CScreen();
-
   /// Bottom to top.
   const std::vector<CTopWindow*>& Windows() const { return m_arrWindows; }
   CTopWindow* Top() const { return m_arrWindows.empty() ? nullptr : m_arrWindows.back(); }
@@ -30,9 +28,9 @@ class CScreen {
   void PaintAll();
   /// Shows the stack if it has changed since it was last shown.
   void Present();
-  /// What was last shown.
-  const CBitmap& Shown() const { return m_pixels; }
 
+  /// A window is being disabled: a press that it or a child of it has is lost.
+  void TakePressFrom(const CWindow& window);
   /// The window is about to be destroyed.
   void Forget(CWindow& window);
 
@@ -41,7 +39,6 @@ class CScreen {
   CTopWindow* WindowUnder(Point at) const;
 
   std::vector<CTopWindow*> m_arrWindows;
-  CBitmap m_pixels;
   bool m_bStale = true;
   CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
 };

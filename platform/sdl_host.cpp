@@ -2,12 +2,12 @@
 
 #include <SDL.h>
 
-#include <cstdlib>
 #include <ctime>
 #include <string_view>
 #include <utility>
 
 #include "platform/help_viewer.h"
+#include "platform/profile_folder.h"
 #include "platform/sdl_keys.h"
 #include "platform/sdl_window.h"
 
@@ -17,7 +17,11 @@ namespace {
 /// SDL's subsystems for as long as the host lives.
 class SdlVideo {
  public:
-  SdlVideo() : m_bReady(SDL_Init(SDL_INIT_VIDEO) == 0) {}
+  SdlVideo() {
+    // A card game that lies idle is no reason to keep the screen on.
+    SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
+    m_bReady = SDL_Init(SDL_INIT_VIDEO) == 0;
+  }
   ~SdlVideo() { SDL_Quit(); }
   SdlVideo(const SdlVideo&) = delete;
   SdlVideo& operator=(const SdlVideo&) = delete;
@@ -30,7 +34,7 @@ class SdlVideo {
   }
 
  private:
-  bool m_bReady;
+  bool m_bReady = false;
 };
 
 class SdlHost : public Host {
@@ -92,12 +96,7 @@ class SdlHost : public Host {
     platform::StartHelpViewer(commandLine);
   }
 
-  std::filesystem::path ProfileFolder() override {
-    const char* configured = std::getenv("XDG_CONFIG_HOME");
-    if (configured != nullptr && configured[0] == '/') return configured;
-    const char* home = std::getenv("HOME");
-    return std::filesystem::path(home == nullptr ? "." : home) / ".config";
-  }
+  std::filesystem::path ProfileFolder() override { return DefaultProfileFolder(); }
 
  private:
   /// Answers whether the event is one for the program; those for the window alone are done here.
@@ -158,7 +157,7 @@ bool SdlHost::TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event) {
   }
   event.kind = InputKind::kKey;
   event.stroke = StrokeOf(key.keysym);
-  return event.stroke.key != Key::kNone;
+  return event.stroke.key != Key::kNone && (key.repeat == 0 || ActsWhileHeld(event.stroke.key));
 }
 
 }  // namespace

@@ -34,10 +34,11 @@ constexpr KeyPair kKeys[] = {
 /// What a key types that is no letter of its own on every keyboard: digits, whichever row or layer
 /// they lie on, and the signs of addition.
 char SignOf(const SDL_Keysym& key) {
-  if (key.sym == SDLK_KP_PLUS || (key.sym == SDLK_EQUALS && (key.mod & KMOD_SHIFT) != 0)) {
+  if (key.sym == SDLK_PLUS || key.sym == SDLK_KP_PLUS ||
+      (key.sym == SDLK_EQUALS && (key.mod & KMOD_SHIFT) != 0)) {
     return '+';
   }
-  if (key.sym == SDLK_KP_MINUS) return '-';
+  if (key.sym == SDLK_MINUS || key.sym == SDLK_KP_MINUS) return '-';
   if (key.sym >= SDLK_KP_1 && key.sym <= SDLK_KP_9) {
     return static_cast<char>('1' + (key.sym - SDLK_KP_1));
   }
@@ -50,6 +51,11 @@ char SignOf(const SDL_Keysym& key) {
 
 char CharacterOf(const SDL_Keysym& key) {
   if (const char sign = SignOf(key); sign != 0) return sign;
+  // Where the keyboard types no Latin letters, a key means the letter that lies there elsewhere.
+  constexpr SDL_Keycode kLastAscii = 0x7F;
+  if (key.sym > kLastAscii && key.scancode >= SDL_SCANCODE_A && key.scancode <= SDL_SCANCODE_Z) {
+    return static_cast<char>('A' + (key.scancode - SDL_SCANCODE_A));
+  }
   if (key.sym < SDLK_SPACE || key.sym > SDLK_z) return 0;
   return static_cast<char>(std::toupper(static_cast<int>(key.sym)));
 }
@@ -70,6 +76,23 @@ KeyStroke StrokeOf(const SDL_Keysym& key) {
   stroke.character = CharacterOf(key);
   if (stroke.character != 0) stroke.key = Key::kCharacter;
   return stroke;
+}
+
+bool ActsWhileHeld(Key key) {
+  switch (key) {
+    case Key::kTab:
+    case Key::kBackspace:
+    case Key::kDelete:
+    case Key::kUp:
+    case Key::kDown:
+    case Key::kLeft:
+    case Key::kRight:
+    case Key::kPageUp:
+    case Key::kPageDown:
+      return true;
+    default:
+      return false;
+  }
 }
 
 }  // namespace platform

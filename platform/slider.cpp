@@ -93,7 +93,7 @@ void CSlider::OnMouseMove(Point p) {
   if (m_bDragging) MoveTo(PosAt(p.y - m_nGrip));
 }
 
-void CSlider::OnLButtonUp(Point) {
+void CSlider::OnPressLost() {
   m_bDragging = false;
   Invalidate();
 }

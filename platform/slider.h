@@ -27,7 +27,8 @@ class CSlider : public CControl {
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
-  void OnLButtonUp(Point) override;
+  void OnLButtonUp(Point) override { OnPressLost(); }
+  void OnPressLost() override;
   void OnMouseWheel(int notches) override { MoveTo(m_nPos - notches * m_nLine); }
   bool OnKeyDown(const KeyStroke& stroke) override;
 

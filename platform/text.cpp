@@ -9,6 +9,7 @@
 #include <memory>
 
 #include "platform/embedded.h"
+#include "platform/utf8.h"
 
 namespace platform {
 namespace {
@@ -93,28 +94,66 @@ void Strike(const SDL_Surface& glyphs, int shift, CBitmap& stencil) {
   }
 }
 
+/// The letters of a text, each with its own width and the extra pixel that striking it twice takes.
+template <class LetterRule>
+void EachLetter(TTF_Font* face, const std::string& text, LetterRule rule) {
+  int left = 0;
+  for (std::size_t at = 0; at < text.size();) {
+    const std::size_t next = NextLetter(text, at);
+    const std::string letter = text.substr(at, next - at);
+    int width = 0;
+    TTF_SizeUTF8(face, letter.c_str(), &width, nullptr);
+    rule(letter, left);
+    left += width + 1;
+    at = next;
+  }
+  rule("", left);
+}
+
+SurfacePtr Render(TTF_Font* face, const std::string& text) {
+  return {TTF_RenderUTF8_Solid(face, text.c_str(), SDL_Color{}), &SDL_FreeSurface};
+}
+
 }  // namespace
 
 Size MeasureText(const Font& font, const std::string& text) {
   const ChosenFace chosen = Choose(font);
   int width = 0;
-  int height = 0;
   if (!text.empty() && chosen.face != nullptr) {
-    TTF_SizeUTF8(chosen.face, text.c_str(), &width, &height);
-    if (chosen.struckTwice) ++width;
+    if (chosen.struckTwice) {
+      EachLetter(chosen.face, text, [&width](const std::string&, int left) { width = left; });
+    } else {
+      TTF_SizeUTF8(chosen.face, text.c_str(), &width, nullptr);
+    }
   }
   return {width, chosen.cellHeight};
+}
+
+std::size_t FittingLength(const Font& font, const std::string& text, int width) {
+  const ChosenFace chosen = Choose(font);
+  int extent = 0;
+  int letters = 0;
+  if (chosen.face == nullptr || text.empty() || width <= 0) return 0;
+  TTF_MeasureUTF8(chosen.face, text.c_str(), width, &extent, &letters);
+  std::size_t at = 0;
+  for (int i = 0; i < letters; ++i) at = NextLetter(text, at);
+  return at;
 }
 
 CBitmap RenderText(const Font& font, const std::string& text) {
   const ChosenFace chosen = Choose(font);
   CBitmap stencil = CBitmap::SeeThrough(MeasureText(font, text));
   if (text.empty() || chosen.face == nullptr) return stencil;
-  const SurfacePtr glyphs(TTF_RenderUTF8_Solid(chosen.face, text.c_str(), SDL_Color{}),
-                          &SDL_FreeSurface);
-  if (glyphs == nullptr) return stencil;
-  Strike(*glyphs, 0, stencil);
-  if (chosen.struckTwice) Strike(*glyphs, 1, stencil);
+  if (!chosen.struckTwice) {
+    if (const SurfacePtr glyphs = Render(chosen.face, text)) Strike(*glyphs, 0, stencil);
+    return stencil;
+  }
+  EachLetter(chosen.face, text, [&](const std::string& letter, int left) {
+    const SurfacePtr glyph = Render(chosen.face, letter);
+    if (glyph == nullptr) return;
+    Strike(*glyph, left, stencil);
+    Strike(*glyph, left + 1, stencil);
+  });
   return stencil;
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
 
 #include "platform/bitmap.h"
@@ -16,6 +17,9 @@ struct Font {
 
 /// The extent of a UTF-8 text; an empty text is 0 wide and a cell high.
 Size MeasureText(const Font& font, const std::string& text);
+
+/// How much of a text, in bytes and whole letters from its start, is at most so many pixels wide.
+std::size_t FittingLength(const Font& font, const std::string& text, int width);
 
 /// The text as a stencil of its extent: opaque pixels where ink stands, see-through ones elsewhere.
 /// A letter that the face lacks shows as a box.

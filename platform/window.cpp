@@ -45,6 +45,7 @@ void CWindow::ShowWindow(bool visible) {
 void CWindow::EnableWindow(bool enabled) {
   if (m_bEnabled == enabled) return;
   m_bEnabled = enabled;
+  if (!enabled) TheApp().Screen().TakePressFrom(*this);
   Invalidate();
 }
 
@@ -65,17 +66,12 @@ CWindow& CWindow::WindowAt(Point p) {
   return *this;
 }
 
-bool CWindow::OnEraseBkgnd(CSurface& surface) {
-  surface.FillRect(surface.Bounds(), kFaceColor);
-  return true;
-}
-
 bool CWindow::PaintInto(CBitmap& pixels, Point origin, bool force) {
   const bool needed = force || m_bInvalid;
   if (needed) {
     m_bInvalid = false;
     CSurface surface(pixels, GetClientRect().Moved(origin));
-    OnEraseBkgnd(surface);
+    if (!OnEraseBkgnd(surface)) surface.FillRect(surface.Bounds(), kFaceColor);
     OnPaint(surface);
   }
   bool painted = needed;

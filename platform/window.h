@@ -25,7 +25,6 @@ class CWindow {
   CWindow& operator=(const CWindow&) = delete;
 
   CWindow* GetParent() const { return m_pParent; }
-  const std::vector<CWindow*>& Children() const { return m_arrChildren; }
   CTopWindow& TopLevel();
 
   const Rect& GetPlace() const { return m_rcPlace; }
@@ -36,7 +35,8 @@ class CWindow {
 
   bool IsVisible() const { return m_bVisible; }
   void ShowWindow(bool visible);
-  /// A disabled window takes no input; neither do its children.
+  /// A disabled window takes no input; neither do its children. A press that one of them has is
+  /// lost.
   bool IsEnabled() const { return m_bEnabled; }
   void EnableWindow(bool enabled);
 
@@ -48,13 +48,15 @@ class CWindow {
   /// The visible, enabled window under a place: a child, a child's child, or this one.
   CWindow& WindowAt(Point p);
 
-  /// Answers whether the background is done; the default paints the common face.
-  virtual bool OnEraseBkgnd(CSurface& surface);
+  /// Paints the background and answers true; false leaves it to the common face.
+  virtual bool OnEraseBkgnd(CSurface&) { return false; }
   virtual void OnPaint(CSurface&) {}
   virtual void OnLButtonDown(Point) {}
   /// While the button or stylus that went down in this window is down; may lie outside of it.
   virtual void OnMouseMove(Point) {}
   virtual void OnLButtonUp(Point) {}
+  /// The press that this window had is over without a release: it was disabled meanwhile.
+  virtual void OnPressLost() {}
   virtual void OnMouseWheel(int) {}
   /// Answers whether the key meant something here; otherwise the parent is asked.
   virtual bool OnKeyDown(const KeyStroke&) { return false; }

@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "platform/look.h"
-#include "platform/utf8.h"
 
 namespace platform {
 namespace {
@@ -33,12 +32,9 @@ std::vector<std::string> WrapText(const std::string& text, int width) {
 
 std::string Ellipsized(const std::string& text, int width) {
   if (MeasureText(kSystemFont, text).width <= width) return text;
-  std::string cut = text;
   const std::string ellipsis = "\xE2\x80\xA6";
-  while (!cut.empty() && MeasureText(kSystemFont, cut + ellipsis).width > width) {
-    cut.resize(PreviousLetter(cut, cut.size()));
-  }
-  return cut + ellipsis;
+  const int room = width - MeasureText(kSystemFont, ellipsis).width;
+  return text.substr(0, FittingLength(kSystemFont, text, room)) + ellipsis;
 }
 
 }  // namespace platform

@@ -1,8 +1,7 @@
 // What only the blackjack table shows.
 
-#include <cstdio>
-
 #include "platform/application.h"
+#include "render/number_text.h"
 #include "render/table_layout.h"
 
 namespace feltside {
@@ -12,14 +11,6 @@ constexpr platform::Font kBoxFont{13, false};
 constexpr platform::Font kBoxTitleFont{13, true};
 constexpr char kBoxTitle[] = "Player";
 constexpr char kAdviceHeading[] = "Basic Strategy says:";
-constexpr platform::Color kAdviceColor = platform::Rgb(200, 0, 0);
-
-template <class Number>
-std::string Format(const char* format, Number number) {
-  char text[400];  // the longest double has 309 digits before its point
-  std::snprintf(text, sizeof text, format, number);
-  return text;
-}
 
 }  // namespace
 
@@ -58,8 +49,8 @@ void CTableLayout::DrawPlayerBox(int stake, double wallet, bool handInProgress) 
   const int walletTop = box.top + h + 15;
   const int stakeTop = walletTop + h + 5;
   const int iconTop = stakeTop + h + 5;
-  DrawMoneyLine(walletTop, h, Format("Wallet: $%.2f", wallet));
-  DrawMoneyLine(stakeTop, h, Format("Current Bet: $%d", stake));
+  DrawMoneyLine(walletTop, h, NumberText("Wallet: $%.2f", wallet));
+  DrawMoneyLine(stakeTop, h, NumberText("Current Bet: $%d", stake));
 
   platform::CResources& resources = platform::TheApp().Resources();
   const platform::Size icon{16, 16};
@@ -83,7 +74,7 @@ void CTableLayout::DrawAdvice(const std::string& text) const {
   const platform::SavedState saved(*m_pDC);
   m_pDC->SetFont(kBoxFont);
   m_pDC->SetBackMode(platform::BackMode::kTransparent);
-  m_pDC->SetTextColor(kAdviceColor);
+  m_pDC->SetTextColor(kMessageColor);
   const Point at = Center() + Point{5, 5};
   m_pDC->TextOut(at, kAdviceHeading);
   m_pDC->TextOut(at + Point{0, m_pDC->TextExtent(kAdviceHeading).height + 5}, text);

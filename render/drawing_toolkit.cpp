@@ -9,17 +9,7 @@ namespace {
 constexpr platform::Font kHandFont{11, false};
 constexpr platform::Font kHandFontBold{11, true};
 constexpr platform::Font kMessageFont{14, true};
-constexpr platform::Color kHandTextColor = platform::Rgb(200, 0, 0);
 constexpr int kTextGap = 10;  ///< between a fan and the text beside it
-
-/// Text without a cell of its own, as whatever lies beneath is to show through.
-void TextOnTable(platform::CSurface& surface, platform::Point at, const std::string& text,
-                 platform::Color table) {
-  surface.SetBackColor(table);
-  surface.SetBackMode(platform::BackMode::kTransparent);
-  surface.TextOut(at, text);
-  surface.SetBackMode(platform::BackMode::kOpaque);
-}
 
 }  // namespace
 
@@ -39,6 +29,13 @@ void CTableLayout::DrawHand(int position, CCardHand hand) const {
   }
 }
 
+void CTableLayout::TextOnTable(Point at, const std::string& text) const {
+  m_pDC->SetBackColor(m_crTable);
+  m_pDC->SetBackMode(platform::BackMode::kTransparent);
+  m_pDC->TextOut(at, text);
+  m_pDC->SetBackMode(platform::BackMode::kOpaque);
+}
+
 void CTableLayout::DrawLabel(int position, const std::string& text) const {
   const platform::Font previous = m_pDC->SetFont(kHandFont);
   const Size extent = m_pDC->TextExtent(text);
@@ -46,7 +43,7 @@ void CTableLayout::DrawLabel(int position, const std::string& text) const {
   at.x -= extent.width + kTextGap;
   const bool atTop = position == POS_TOP || position == POS_TOP_LEFT || position == POS_TOP_RIGHT;
   if (!atTop) at.y += m_nCardHeight - extent.height;
-  TextOnTable(*m_pDC, at, text, m_crTable);
+  TextOnTable(at, text);
   m_pDC->SetFont(previous);
 }
 
@@ -70,11 +67,11 @@ Point CTableLayout::HandTextPos(int position, int textHeight) const {
 
 void CTableLayout::DrawHandText(int position, const std::string& text, bool bold) const {
   const platform::Font previous = m_pDC->SetFont(bold ? kHandFontBold : kHandFont);
-  const platform::Color previousColor = m_pDC->SetTextColor(kHandTextColor);
+  const platform::Color previousColor = m_pDC->SetTextColor(kMessageColor);
   const Point at = HandTextPos(position, m_pDC->TextExtent(text).height);
   // The message of the whole deal is larger than the others, but stands as if it were not.
   if (position == POS_ABOVE_BOTTOM) m_pDC->SetFont(kMessageFont);
-  TextOnTable(*m_pDC, at, text, m_crTable);
+  TextOnTable(at, text);
   m_pDC->SetFont(previous);
   m_pDC->SetTextColor(previousColor);
 }

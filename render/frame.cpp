@@ -53,6 +53,7 @@ void CFeltsideView::DrawTable(CSurface& surface) {
   } else if (m_nGameType == kGameVideoPoker) {
     DrawVideoPokerTable(frame);
   }
+  m_layout.Release();
   surface.BitBlt(client.TopLeft(), size, pixels);
 }
 

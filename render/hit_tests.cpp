@@ -22,15 +22,18 @@ int CTableLayout::HitInsuranceNo(Point p) const {
   return Rect{Center().x + 10, y - 27, Center().x + 83, y - 10}.Contains(p) ? 1 : 0;
 }
 
-int CTableLayout::HitBetDown(Point p) const {
+int CTableLayout::StakeTop() const {
   const int h = TitleHeight();
-  const int top = BoxRect(h).top + 3 * h + 25;
+  return BoxRect(h).top + 3 * h + 25;
+}
+
+int CTableLayout::HitBetDown(Point p) const {
+  const int top = StakeTop();
   return Rect{Center().x - 35, top, Center().x - 18, top + 20}.Contains(p) ? 1 : 0;
 }
 
 int CTableLayout::HitBetUp(Point p) const {
-  const int h = TitleHeight();
-  const int top = BoxRect(h).top + 3 * h + 25;
+  const int top = StakeTop();
   return Rect{Center().x - 21, top, Center().x - 1, top + 20}.Contains(p) ? 1 : 0;
 }
 

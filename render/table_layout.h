@@ -25,13 +25,19 @@ enum TablePosition {
   POS_ABOVE_BOTTOM_RIGHT = 15,
 };
 
+/// Of hand totals, messages and advice: a dark red.
+inline constexpr platform::Color kMessageColor = platform::Rgb(200, 0, 0);
+
 /// Knows where everything stands on the table, draws it there, and finds what a tap hit by the very
 /// same coordinates. All are pixels of the view's client area; a card is always 29 × 41.
 class CTableLayout {
  public:
   /// Binds the surface to draw into and the client rectangle to place things in. The surface is the
-  /// caller's and must live until the paint or tap that called this is over.
+  /// caller's and must live until Release.
   void Prepare(platform::CSurface& surface, const platform::Rect& client);
+
+  /// Forgets the surface.
+  void Release() { m_pDC = nullptr; }
 
   /// The top-left corner of the card in a slot (0 is the first) of a position. Leaves x and y alone
   /// for a position that holds no cards.
@@ -73,7 +79,7 @@ class CTableLayout {
   /// The slot of the middle row's card under the point, 0..4; -1 for none.
   int HitTestCard(platform::Point p) const;
 
-  platform::CSurface* m_pDC = nullptr;  ///< valid from Prepare to the end of that paint or tap
+  platform::CSurface* m_pDC = nullptr;  ///< from Prepare to Release
   platform::Rect m_rcTable;             ///< the client rectangle; empty before the first Prepare
   platform::Color m_crTable = platform::kWhite;  ///< the felt
   platform::Color m_crBox = platform::kWhite;    ///< the player box
@@ -98,6 +104,10 @@ class CTableLayout {
   void DrawMoneyLine(int top, int titleHeight, const std::string& text) const;
   void DrawPayRow(int row, int rowHeight, int numberWidth) const;
   platform::Point HandTextPos(int position, int textHeight) const;
+  /// Text without a cell of its own, as whatever lies beneath is to show through.
+  void TextOnTable(platform::Point at, const std::string& text) const;
+  /// The top of both stake buttons' tap areas.
+  int StakeTop() const;
 };
 
 }  // namespace feltside

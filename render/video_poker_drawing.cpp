@@ -77,15 +77,15 @@ void CTableLayout::DrawPlayButton(bool deal) const {
 }
 
 void CTableLayout::DrawAmount(int position, int dollars) const {
-  const platform::SavedState saved(*m_pDC);
-  m_pDC->SetFont(kPayFont);
-  m_pDC->SetTextColor(kAmountColor);
+  const platform::Font previous = m_pDC->SetFont(kPayFont);
+  const platform::Color previousColor = m_pDC->SetTextColor(kAmountColor);
   std::string text = std::to_string(dollars);
   text.insert(text.begin(), '$');
   const platform::Size extent = m_pDC->TextExtent(text);
-  m_pDC->SetBackMode(platform::BackMode::kTransparent);
   const Point at = CardCorner(position, 0);
-  m_pDC->TextOut({at.x - extent.width - 10, at.y - 2 * extent.height - 3 + m_nCardHeight}, text);
+  TextOnTable({at.x - extent.width - 10, at.y - 2 * extent.height - 3 + m_nCardHeight}, text);
+  m_pDC->SetFont(previous);
+  m_pDC->SetTextColor(previousColor);
 }
 
 }  // namespace feltside

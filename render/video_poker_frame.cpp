@@ -1,7 +1,6 @@
 // One video-poker frame, from the state of the table.
 
-#include <cstdio>
-
+#include "render/number_text.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -49,10 +48,8 @@ void CFeltsideView::DrawFancyPokerTexts(platform::CSurface& surface) {
   surface.SetTextColor(platform::kWhite);
   surface.SetBackColor(kButtonCell);
   surface.TextOut(kButtonTextAt, m_bHandInProgress == 0 ? "Deal" : "Play");
-  char wallet[400];  // the longest double has 309 digits before its point
-  std::snprintf(wallet, sizeof wallet, "$%.0f", m_dWallet);
   surface.SetBackColor(kWalletCell);
-  surface.TextOut(kWalletTextAt, wallet);
+  surface.TextOut(kWalletTextAt, NumberText("$%.0f", m_dWallet));
   surface.SetBackColor(kResultCell);
   surface.SetTextColor(kResultColor);
   surface.TextOut(kResultTextAt, m_strPlayerMsg);

@@ -1,11 +1,13 @@
 #include "shell/stylus.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
 #include <sstream>
+#include <utility>
 
 #include "platform/combo_box.h"
 #include "platform/slider.h"
@@ -14,6 +16,12 @@
 
 namespace feltside {
 namespace {
+
+/// What is wrong with a command.
+struct CommandError {
+  explicit CommandError(std::string text) : what(std::move(text)) {}
+  std::string what;
+};
 
 constexpr std::size_t kAnyNumber = static_cast<std::size_t>(-1);
 
@@ -27,7 +35,7 @@ int ToInt(const std::string& word) {
   int value = 0;
   const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
   if (error != std::errc{} || end != word.data() + word.size()) {
-    throw std::string("not a whole number: " + word);
+    throw CommandError("not a whole number: " + word);
   }
   return value;
 }
@@ -36,15 +44,24 @@ double ToMoney(const std::string& word) {
   char* end = nullptr;
   const double value = std::strtod(word.c_str(), &end);
   if (end == word.c_str() || *end != '\0' || !std::isfinite(value)) {
-    throw std::string("no amount of money: " + word);
+    throw CommandError("no amount of money: " + word);
   }
   return value;
 }
 
 bool IsLeapYear(int year) { return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0; }
 
+/// Digits and signs just where "YYYY-MM-DDTHH:MM:SS" has them.
+bool HasDateShape(const std::string& text) {
+  const std::string shape = "0000-00-00T00:00:00";
+  const auto alike = [](char shown, char given) {
+    return shown == '0' ? given >= '0' && given <= '9' : shown == given;
+  };
+  return std::equal(shape.begin(), shape.end(), text.begin(), text.end(), alike);
+}
+
 bool IsDate(const platform::LocalTime& t) {
-  if (t.month < 1 || t.month > 12) return false;
+  if (t.year < 1 || t.month < 1 || t.month > 12) return false;
   constexpr std::array<int, 12> kDays = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
   const int leapDay = t.month == 2 && IsLeapYear(t.year) ? 1 : 0;
   return t.day >= 1 && t.day <= kDays[static_cast<std::size_t>(t.month - 1)] + leapDay &&
@@ -132,7 +149,7 @@ bool CStylus::OnIdle() {
   std::string line;
   do {
     if (!std::getline(m_in, line)) return false;
-  } while (line.empty() || line[0] == '#');
+  } while (line.find_first_not_of(" \t\r") == std::string::npos || line[0] == '#');
   Interpret(line);
   return true;
 }
@@ -154,16 +171,16 @@ void CStylus::Interpret(const std::string& line) {
       if (words.empty() || words[0] != command.name) continue;
       const std::size_t following = words.size() - 1;
       if (following < command.fewest || following > command.most) {
-        throw std::string("wrong number of words: " + line);
+        throw CommandError("wrong number of words: " + line);
       }
       // A text is taken as it stands, blanks and all.
       words[0] = line;
       return (this->*command.run)(words);
     }
-    throw std::string("unknown command: " + line);
-  } catch (const std::string& what) {
+    throw CommandError("unknown command: " + line);
+  } catch (const CommandError& error) {
     m_bWithState = false;
-    m_answer["error"] = what;
+    m_answer["error"] = error.what;
   }
 }
 
@@ -212,8 +229,8 @@ void CStylus::Touch(const Words& words) {
 
 void CStylus::ChooseCommand(const Words& words) {
   const int commandID = ToInt(words[1]);
-  DismissPopups();
   if (m_app.MainFrame()->IsCommandEnabled(commandID)) {
+    DismissPopups();
     m_app.Queue().PostCommand(commandID);
   } else {
     m_answer["refused"] = true;
@@ -222,7 +239,7 @@ void CStylus::ChooseCommand(const Words& words) {
 
 void CStylus::PressKey(const Words& words) {
   const auto stroke = platform::ParseChord(words[1]);
-  if (!stroke) throw std::string("no such key: " + words[1]);
+  if (!stroke) throw CommandError("no such key: " + words[1]);
   platform::InputEvent event;
   event.kind = platform::InputKind::kKey;
   event.stroke = *stroke;
@@ -236,18 +253,12 @@ void CStylus::Type(const Words& words) {
   m_host.PutInput(event);
 }
 
-platform::CDialog& CStylus::ClearedDialog() {
-  platform::CDialog* dialog = TopDialog();
-  if (dialog == nullptr) throw std::string("no dialog is open");
-  DismissPopups();
-  return *dialog;
-}
-
 platform::CControl& CStylus::LiveControl(const std::string& word) {
   const int controlID = ToInt(word);
-  platform::CControl* control = ClearedDialog().GetDlgItem(controlID);
+  const platform::CDialog* dialog = TopDialog();
+  platform::CControl* control = dialog == nullptr ? nullptr : dialog->GetDlgItem(controlID);
   if (control == nullptr || !control->IsVisible() || !control->IsEnabled()) {
-    throw std::string("no such control: " + word);
+    throw CommandError("no such control: " + word);
   }
   return *control;
 }
@@ -256,8 +267,9 @@ void CStylus::Press(const Words& words) {
   const platform::CControl& control = LiveControl(words[1]);
   const std::string kind = control.KindName();
   if (kind != "button" && kind != "check" && kind != "list") {
-    throw std::string("not to be pressed: " + words[1]);
+    throw CommandError("not to be pressed: " + words[1]);
   }
+  DismissPopups();
   const platform::Rect place = control.GetClientRect();
   PutTap(control.ScreenOrigin() + platform::Point{place.right / 2, place.bottom / 2});
 }
@@ -265,30 +277,29 @@ void CStylus::Press(const Words& words) {
 void CStylus::Select(const Words& words) {
   const int item = ToInt(words[2]);
   auto* list = dynamic_cast<platform::CComboBox*>(&LiveControl(words[1]));
-  if (list == nullptr) throw std::string("no list: " + words[1]);
-  if (item < 0 || item >= list->GetItemCount()) throw std::string("no such item: " + words[2]);
+  if (list == nullptr) throw CommandError("no list: " + words[1]);
+  if (item < 0 || item >= list->GetItemCount()) throw CommandError("no such item: " + words[2]);
+  DismissPopups();
   list->Choose(item);
 }
 
 void CStylus::Slide(const Words& words) {
   const int value = ToInt(words[2]);
   auto* slider = dynamic_cast<platform::CSlider*>(&LiveControl(words[1]));
-  if (slider == nullptr) throw std::string("no slider: " + words[1]);
+  if (slider == nullptr) throw CommandError("no slider: " + words[1]);
   if (value < slider->GetLowest() || value > slider->GetHighest()) {
-    throw std::string("beyond the slider's range: " + words[2]);
+    throw CommandError("beyond the slider's range: " + words[2]);
   }
   slider->MoveTo(value);
 }
 
 void CStylus::SetClock(const Words& words) {
   platform::LocalTime t{};
-  int length = 0;
   const std::string& text = words[1];
-  const int read = std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d%n", &t.year, &t.month, &t.day,
-                               &t.hour, &t.minute, &t.second, &length);
-  constexpr int kTextLength = 19;
-  if (read != 6 || length != kTextLength || text.size() != kTextLength || !IsDate(t)) {
-    throw std::string("no date and time: " + text);
+  const int read = std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d", &t.year, &t.month, &t.day,
+                               &t.hour, &t.minute, &t.second);
+  if (!HasDateShape(text) || read != 6 || !IsDate(t)) {
+    throw CommandError("no date and time: " + text);
   }
   m_host.SetClock(t);
 }
@@ -297,7 +308,7 @@ void CStylus::Stack(const Words& words) {
   std::vector<int> cards;
   for (std::size_t i = 1; i < words.size(); ++i) cards.push_back(ToInt(words[i]));
   const std::string wrong = CTableState(View()).Stack(cards);
-  if (!wrong.empty()) throw wrong;
+  if (!wrong.empty()) throw CommandError(wrong);
 }
 
 void CStylus::SetWallet(const Words& words) {
@@ -307,8 +318,8 @@ void CStylus::SetWallet(const Words& words) {
 
 void CStylus::Shot(const Words& words) {
   m_bWithState = false;
-  if (!platform::SavePng(m_app.Screen().Shown(), words[1])) {
-    throw std::string("cannot write " + words[1]);
+  if (!platform::SavePng(m_host.Shown(), words[1])) {
+    throw CommandError("cannot write " + words[1]);
   }
 }
 

@@ -23,7 +23,7 @@ class CStylus {
  private:
   using Json = nlohmann::ordered_json;
   using Words = std::vector<std::string>;
-  /// A command's name, how many words follow it, and what it does; it throws an std::string that
+  /// A command's name, how many words follow it, and what it does; it throws a CommandError that
   /// says what is wrong with it.
   struct Command {
     const char* name;
@@ -54,10 +54,9 @@ class CStylus {
   void Select(const Words& words);
   void Slide(const Words& words);
   void PutTap(platform::Point at);
-  /// The dialog on top, menus and lists over it closed; throws where there is none.
-  platform::CDialog& ClearedDialog();
-  /// A control that can be worked with; throws where there is none of that number.
-  platform::CControl& LiveControl(const std::string& word);
+  /// A control of the topmost dialog that can be worked with; throws where there is none of that
+  /// number.
+  static platform::CControl& LiveControl(const std::string& word);
 
   platform::OffscreenHost& m_host;
   CFeltsideApp& m_app;

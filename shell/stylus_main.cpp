@@ -1,17 +1,14 @@
-#include <cstdlib>
-#include <filesystem>
+// The game without a window, played by commands. It reads and keeps settings where the game does,
+// so whoever tries things out gives it an XDG_CONFIG_HOME of its own.
+
 #include <iostream>
 
 #include "platform/offscreen_host.h"
+#include "platform/profile_folder.h"
 #include "shell/stylus.h"
 
 int main(int, char**) {
-  const char* configured = std::getenv("XDG_CONFIG_HOME");
-  // Without a folder of its own it would play with the person's settings.
-  const std::filesystem::path folder =
-      configured != nullptr ? configured
-                            : std::filesystem::temp_directory_path() / "feltside-stylus";
-  platform::OffscreenHost host(folder);
+  platform::OffscreenHost host(platform::DefaultProfileFolder());
   platform::SetHost(&host);
   feltside::CFeltsideApp app;
   return feltside::CStylus(host, app, std::cin, std::cout).Run();

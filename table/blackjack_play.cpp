@@ -6,7 +6,6 @@ namespace feltside {
 namespace {
 
 constexpr int kBlackjackHandLimit = 12;
-constexpr int kTwentyOne = 21;
 constexpr int kBetStep = 5;
 constexpr char kBlackjackText[] = "Blackjack!";
 
@@ -115,7 +114,7 @@ void CFeltsideView::DoubleDown() {
   } else if (!playingSplit && bust) {
     Settle();
   } else {
-    Repaint();
+    if (!playingSplit) Repaint();
     DealerPlay();
   }
 }

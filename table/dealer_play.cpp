@@ -12,7 +12,6 @@ namespace {
 
 constexpr int kDealerStands = 17;
 constexpr int kDealerCards = 5;  ///< the dealer draws no sixth card
-constexpr int kTwentyOne = 21;
 
 bool IsPlayCommand(const platform::Message& message) {
   if (message.kind != platform::MessageKind::kCommand) return false;

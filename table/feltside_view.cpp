@@ -1,5 +1,6 @@
 #include "table/feltside_view.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -50,22 +51,18 @@ CShoe* CFeltsideView::SelectedShoe() {
 
 int CFeltsideView::NextCard() {
   CShoe* shoe = SelectedShoe();
-  return shoe == nullptr ? kNoCard : DrawFrom(*shoe);
+  return shoe == nullptr ? kNoCard : DrawFrom(*shoe, {&m_handPlayer, &m_handSplit, &m_handDealer});
 }
 
-int CFeltsideView::DrawFrom(CShoe& shoe) {
+int CFeltsideView::DrawFrom(CShoe& shoe, std::initializer_list<const CCardHand*> out) {
   int card = shoe.TakeCard();
   if (card != kNoCard) return card;
   shoe.Shuffle();
+  const auto holds = [&card](const CCardHand* hand) { return hand->Contains(card); };
   do {
     card = shoe.TakeCard();
-  } while (IsOnTable(card));
+  } while (std::any_of(out.begin(), out.end(), holds));
   return card;
-}
-
-bool CFeltsideView::IsOnTable(int card) const {
-  if (m_nGameType == kGameVideoPoker) return m_handPoker.Contains(card);
-  return m_handPlayer.Contains(card) || m_handSplit.Contains(card) || m_handDealer.Contains(card);
 }
 
 void CFeltsideView::PrepareShoe() {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <initializer_list>
 #include <memory>
 #include <string>
 
@@ -79,10 +80,9 @@ class CFeltsideView : public platform::CView {
   void LowerBet();
   void PlaySplitHand();
   int NextCard();
-  /// A shoe's next card. When it has run out in the middle of a deal, all cards but those that lie
-  /// on the table are shuffled first, as a dealer would.
-  int DrawFrom(CShoe& shoe);
-  bool IsOnTable(int card) const;
+  /// A shoe's next card. When it has run out in the middle of a deal, it is shuffled anew and no
+  /// card comes that is out already (of several decks, none that is its equal either).
+  static int DrawFrom(CShoe& shoe, std::initializer_list<const CCardHand*> out);
   void PrepareShoe();
   /// The shoe that blackjack deals from; null for a deck choice outside 0..2.
   CShoe* SelectedShoe();

@@ -26,15 +26,17 @@ void CFeltsideView::TapBlackjack(Point p) {
     m_bShowAdvice = 1;
     Repaint();
   }
+  if (m_bInsuranceOffered == 0 && m_bHandInProgress != 0) return;
   // The targets below are placed by a measured text, so the layout needs a surface to measure on.
   platform::CBitmap nothing;
   platform::CSurface surface(nothing);
   m_layout.Prepare(surface, GetClientRect());
   if (m_bInsuranceOffered != 0) {
     TapInsurance(p);
-  } else if (m_bHandInProgress == 0) {
+  } else {
     TapStake(p);
   }
+  m_layout.Release();
 }
 
 /// Before the first table frame nothing stands on the table that could be hit.

@@ -25,7 +25,7 @@ void CFeltsideView::DealVideoPoker() {
   m_layout.m_nRowCards = kPokerCards;
   m_handPoker.Clear();
   for (int i = 0; i < kPokerCards; ++i) {
-    const int card = DrawFrom(m_deck1);
+    const int card = DrawFrom(m_deck1, {&m_handPoker});
     if (!IsCard(card)) platform::MessageBox(std::to_string(card) + " is being put in!");
     m_handPoker.AddCard(card);
   }
@@ -44,13 +44,20 @@ void CFeltsideView::ToggleDiscard(int slot) {
 }
 
 void CFeltsideView::DrawVideoPoker() {
+  // Cards that were thrown away do not come back in the same deal.
+  CCardHand out = m_handPoker;
+  out.SetLimit(2 * kPokerCards);
   int discarded = 0;
   // From the last slot to the first, so that the slots still to come stay where they are.
   for (int slot = m_handPoker.GetCount() - 1; slot >= 0; --slot) {
     if (m_bDiscard[static_cast<std::size_t>(slot)] == 0) continue;
     discarded += m_handPoker.RemoveCard(m_handPoker.GetCard(slot));
   }
-  for (int i = 0; i < discarded; ++i) m_handPoker.AddCard(DrawFrom(m_deck1));
+  for (int i = 0; i < discarded; ++i) {
+    const int card = DrawFrom(m_deck1, {&out});
+    out.AddCard(card);
+    m_handPoker.AddCard(card);
+  }
   m_bDiscard.fill(0);
   m_dWallet += ScorePoker(m_handPoker, m_strPlayerMsg);
   m_bHandInProgress = 0;

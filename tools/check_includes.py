@@ -34,10 +34,10 @@ SYSTEM = r"(sys/\w+|fcntl|unistd|signal|poll|errno|dirent)\.h"
 GTEST = r"g(test|mock)/g(test|mock).*\.h"
 JSON = r"nlohmann/.*"
 
-# The same for the headers of libraries. The standard library's have neither a dot nor a slash.
+# The same for the headers of libraries.
 LIBRARIES = [
     (r"platform/sdl_\w+\.h", SDL),
-    (r"platform/\w+\.cpp", f"{SDL}|toml\\+\\+/.*|{SYSTEM}"),
+    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|toml\\+\\+/.*|{SYSTEM}"),
     (r"shell/.*", JSON),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", r"benchmark/.*"),
@@ -45,7 +45,7 @@ LIBRARIES = [
 ]
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
-SDL_NAME = re.compile(r"\b(SDL|TTF|IMG)_\w+")
+LIBRARY_NAME = re.compile(r"\b(?:SDL|TTF|png)_\w+|\btoml::\w+")
 
 
 def source_files():
@@ -70,11 +70,15 @@ def may_include_ours(path, included):
     return True
 
 
+def is_standard(included):
+    """The headers of the standard library have neither a dot nor a slash."""
+    return re.fullmatch(r"\w+", included) is not None
+
+
 def may_include_library(path, included):
-    if re.fullmatch(r"\w+", included):
-        return True
-    return any(re.fullmatch(files, path) and re.fullmatch(allowed, included)
-               for files, allowed in LIBRARIES)
+    return is_standard(included) or any(
+        re.fullmatch(files, path) and re.fullmatch(allowed, included)
+        for files, allowed in LIBRARIES)
 
 
 def without_comments(text):
@@ -100,11 +104,11 @@ class Checker:
                 self.fault(path, number, f'may not include "{included}"')
 
     def check_names(self, path, text):
-        """Even by name SDL is known to the layer alone."""
+        """Even by name the libraries are known to the layer alone."""
         if re.fullmatch(r"platform/(\w+\.cpp|sdl_\w+\.h)", path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
-            if match := SDL_NAME.search(line):
+            if match := LIBRARY_NAME.search(line):
                 self.fault(path, number, f"may not use {match[0]}")
 
     def reached_from(self, path, seen):
@@ -116,13 +120,13 @@ class Checker:
         return seen
 
     def check_reach(self, path):
-        """No header of SDL comes to the game through one of the layer's."""
+        """No library comes to the game through a header of the layer."""
         if path.startswith("platform/"):
             return
         for header in sorted(self.reached_from(path, set())):
-            if any(not own and included.startswith("SDL")
-                   for _, own, included in includes_of(self.texts[header])):
-                self.fault(path, 1, f"is brought SDL by {header}")
+            for _, own, included in includes_of(self.texts[header]):
+                if header.startswith("platform/") and not own and not is_standard(included):
+                    self.fault(path, 1, f"is brought <{included}> by {header}")
 
     def run(self):
         for path, text in self.texts.items():

@@ -27,6 +27,7 @@ check_packages="$play_packages"'
   clang-format         command  clang-format
   libgtest-dev         module   gtest
   libgmock-dev         module   gmock
+  tidy                 command  tidy
   python3              command  python3
   python3-pil          python   PIL
 '

@@ -1,0 +1,11 @@
+#pragma once
+
+#include <filesystem>
+
+namespace platform {
+
+/// The folder where desktops keep programs' settings: $XDG_CONFIG_HOME where that is an absolute
+/// path, else .config in the person's home. It need not exist yet.
+std::filesystem::path DefaultProfileFolder();
+
+}  // namespace platform
