@@ -1,6 +1,6 @@
 """The card backs. Each is one function; BACKS lists them in the order of their numbers."""
 
-from math import atan2, pi
+from math import atan2, hypot, pi, sin
 from pathlib import Path
 
 from card_base import HEIGHT, WIDTH, new_card
@@ -13,6 +13,8 @@ MIDDLE_X, MIDDLE_Y = WIDTH // 2, HEIGHT // 2
 # Where the panel of a back begins, in pixels from the edge of the card: it leaves a white margin
 # inside the outline.
 PANEL = 3
+# How far the points of a star reach from its middle, and the notches between them.
+STAR, NOTCH = 10, 4.4
 
 
 def make_all(folder):
@@ -24,8 +26,8 @@ def make_all(folder):
 def _panel(pattern, border):
     """A card with a panel whose colours `pattern` gives for the distances from the middle."""
     card = new_card()
-    for y in range(PANEL, HEIGHT - PANEL):
-        for x in range(PANEL, WIDTH - PANEL):
+    for y in range(PANEL + 1, HEIGHT - PANEL - 1):
+        for x in range(PANEL + 1, WIDTH - PANEL - 1):
             card.put(x, y, pattern(x - MIDDLE_X, y - MIDDLE_Y))
     _frame(card, PANEL, border)
     return card
@@ -73,14 +75,15 @@ def purple():
 def dirty_yellow():
     """A honeycomb on which somebody has put down a cup."""
     card = _tiled("dirty yellow tile", {" ": "mustard_light", "h": "mustard"}, "mustard_dark")
-    card.text_grid(9, 20, GRIDS["stain"], {"s": "mustard_dark"})
+    card.text_grid(8, 19, GRIDS["stain"], {"s": "brown", "t": "tan"})
     return card
 
 
 def _pinstripes(strong, faint):
-    stripes = (strong, "white", faint, "white")
-    card = _panel(lambda dx, dy: stripes[dx % 4], "white")
-    _frame(card, PANEL - 1, strong)
+    """Stripes that keep clear of the frame on all sides."""
+    stripes = (faint, "white", "white", strong, "white", "white")
+    card = _panel(lambda dx, dy: stripes[dx % 6], strong)
+    _frame(card, PANEL + 1, "white")
     return card
 
 
@@ -98,7 +101,7 @@ def smiley():
         return "blue_light" if dx % 4 == 0 and dy % 4 == 0 else "blue_mid"
 
     card = _panel(dots, "blue_dark")
-    _centred(card, 9, "smiley", {"#": "ink", "y": "gold_light", "g": "gold", "o": "orange",
+    _centred(card, 11, "smiley", {"#": "ink", "y": "gold_light", "g": "gold", "o": "orange",
                                  "p": "gold_pale", "w": "white", "r": "red"})
     return card
 
@@ -106,17 +109,40 @@ def smiley():
 def skull():
     """Who always wins in the end: with hearts for eyes and a golden tooth."""
     card = _panel(lambda dx, dy: "black", "grey_80")
-    colours = {"#": "black", "w": "white", "e": "grey_c0", "g": "gold"}
+    colours = {"#": "black", "w": "white", "e": "grey_c0", "g": "gold",
+               "y": "gold_light"}
     _centred(card, 5, "skull", colours)
     _centred(card, 25, "bones", colours)
     return card
 
 
+def _star(card, outline, light, shade):
+    """A star of five facetted points in the middle of the card."""
+    def facet(dx, dy):
+        """Which of the ten facets a point lies in; None outside the star."""
+        turn = atan2(dx, -dy) * 5 / pi
+        place = int(turn // 1)
+        # From the tip of a point (0) to the notch beside it (1).
+        part = turn - place if place % 2 == 0 else place + 1 - turn
+        tip, notch = part * pi / 5, (1 - part) * pi / 5
+        edge = STAR * NOTCH * sin(pi / 5) / (STAR * sin(tip) + NOTCH * sin(notch))
+        return place if hypot(dx, dy) <= edge else None
+
+    for dy in range(-STAR, STAR):
+        for dx in range(-STAR, STAR + 1):
+            place = facet(dx, dy)
+            if place is None:
+                continue
+            beside = (facet(dx + x, dy + y) for x, y in ((-1, 0), (1, 0), (0, -1), (0, 1)))
+            name = outline if None in beside else (shade if place % 2 == 0 else light)
+            card.put(MIDDLE_X + dx, MIDDLE_Y + dy, name)
+
+
 def blue_star():
     card = _panel(lambda dx, dy: "blue_pale", "blue")
-    _centred(card, 10, "star", {"#": "navy", "d": "blue", "l": "blue_mid"})
-    for x in (5, 19):
-        for y in (5, 31):
+    _star(card, "navy", "blue_mid", "blue")
+    for x in (5, 17):
+        for y in (5, 29):
             card.text_grid(x, y, GRIDS["small star"], {"#": "blue"})
     return card
 
@@ -126,7 +152,7 @@ def purple_star():
         return "purple_pale" if (atan2(dx, dy) * 8 / pi + 0.5) % 2 < 1 else "white"
 
     card = _panel(rays, "purple")
-    _centred(card, 10, "star", {"#": "purple_dark", "d": "purple", "l": "purple_light"})
+    _star(card, "purple_dark", "purple_light", "purple")
     return card
 
 
@@ -148,13 +174,14 @@ def _brushed_plate():
 
 
 def metal_rivet():
-    """A riveted plate, from which one rivet has come loose and gone."""
+    """A riveted plate; where one rivet has gone, a sticking plaster will have to do."""
     card = _brushed_plate()
     colours = {"l": "white", "m": "steel_pale", "d": "steel_light", "s": "steel",
-               "S": "steel_dark", "k": "black"}
+               "S": "steel_dark"}
     for y in (4, 18, 32):
         for x in (4, 12, 20):
-            card.text_grid(x, y, GRIDS["empty hole" if (x, y) == (20, 18) else "rivet"], colours)
+            card.text_grid(x, y, GRIDS["rivet"], colours)
+    _centred(card, 18, "plaster", {"a": "skin", "b": "pink", "d": "skin_shade"})
     return card
 
 

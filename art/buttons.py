@@ -30,7 +30,7 @@ def strategy_button():
 
 def word_button(width, word):
     button = raised(width, 17)
-    BOLD.write_centred(button, 0, width - 1, 4, word, "red_dark")
+    BOLD.write_centred(button, 0, width - 1, 5, word, "red_dark")
     return button
 
 
@@ -62,7 +62,7 @@ def active_mark():
 def tool_bar():
     colours = {
         "K": "ink", "W": "white", "R": "card_red", "r": "red_dark", "G": "lamp_green",
-        "B": "blue", "b": "navy", "L": "grey_d8",
+        "B": "blue",
     }
     bar = Canvas(80, 15, "nothing")
     pictures = read_grids(_SOURCES / "tool_bar.txt")

@@ -16,33 +16,31 @@ RANKS = (("ace", "A"), ("two", "2"), ("three", "3"), ("four", "4"), ("five", "5"
          ("seven", "7"), ("eight", "8"), ("nine", "9"), ("ten", "10"), ("jack", "J"),
          ("queen", "Q"), ("king", "K"))
 
-BLACK_SUIT = {"#": "black", "+": "grey_a0"}
-RED_SUIT = {"#": "card_red", "+": "red_light"}
+BLACK_SUIT = {"#": "black", "+": "grey_80"}
+RED_SUIT = {"#": "card_red"}
 SUIT_COLOURS = {"clubs": BLACK_SUIT, "diamonds": RED_SUIT, "hearts": RED_SUIT,
                 "spades": BLACK_SUIT}
 
-# Where the corner index stands: it must end left of column 9, which is all that a fan shows.
-GLYPH_X, GLYPH_Y = 2, 2
-INDEX_PIP_X, INDEX_PIP_Y = 1, 10
+# Where the corner index stands: centred on a column, as a fan shows just columns 0 to 8 of a card.
+INDEX_MIDDLE, GLYPH_Y, INDEX_PIP_Y = 4, 2, 10
 
 # Top left corners of the pips. The first places are set again upside down in the lower half, the
-# second ones are not.
+# second ones are not. Side by side or one below the other, they stand evenly spaced.
 LEFT, MIDDLE, RIGHT = 9, 12, 15
-_PAIR = ((LEFT, 3), (RIGHT, 3))
-_MIDDLE_PAIR = ((LEFT, 17), (RIGHT, 17))
-_TWO_PAIRS = _PAIR + ((LEFT, 13), (RIGHT, 13))
+_PAIR = ((LEFT, 4), (RIGHT, 4))
+_FOUR_PAIRS = ((LEFT, 3), (RIGHT, 3), (LEFT, 13), (RIGHT, 13))
 PIP_PLACES = {
-    "2": (((11, 4),), ()),
-    "3": (((11, 4),), ((11, 17),)),
+    "2": (((10, 4),), ()),
+    "3": (((10, 4),), ((10, 16),)),
     "4": (_PAIR, ()),
     "5": (_PAIR, ((MIDDLE, 17),)),
-    "6": (_PAIR, _MIDDLE_PAIR),
-    "7": (_PAIR, _MIDDLE_PAIR + ((MIDDLE, 10),)),
-    "8": (_PAIR + ((MIDDLE, 10),), _MIDDLE_PAIR),
-    "9": (_TWO_PAIRS, ((MIDDLE, 18),)),
-    "10": (_TWO_PAIRS + ((MIDDLE, 8),), ()),
+    "6": (_PAIR, ((LEFT, 17), (RIGHT, 17))),
+    "7": (_PAIR, ((LEFT, 18), (RIGHT, 18), (MIDDLE, 11))),
+    "8": (_PAIR + ((MIDDLE, 11),), ((LEFT, 18), (RIGHT, 18))),
+    "9": (_FOUR_PAIRS, ((MIDDLE, 18),)),
+    "10": (_FOUR_PAIRS + ((MIDDLE, 8),), ()),
 }
-PIP_SIZES = {"2": "index", "3": "index", "9": "tiny", "10": "tiny"}
+PIP_SIZES = {"2": "big", "3": "big", "4": "medium", "5": "medium", "6": "medium"}
 
 
 def make_all(folder):
@@ -70,9 +68,9 @@ def make_face(suit, name, letter):
 
 def _make_index(suit, letter):
     index = Canvas(WIDTH, HEIGHT)
-    colours = SUIT_COLOURS[suit]
-    index.text_grid(GLYPH_X, GLYPH_Y, GLYPHS[letter], colours)
-    index.text_grid(INDEX_PIP_X, INDEX_PIP_Y, PIPS[f"{suit} index"], colours)
+    for y, sign in ((GLYPH_Y, GLYPHS[letter]), (INDEX_PIP_Y, PIPS[f"{suit} index"])):
+        x = INDEX_MIDDLE - (len(sign[0]) - 1) // 2
+        index.text_grid(x, y, sign, SUIT_COLOURS[suit])
     return index
 
 

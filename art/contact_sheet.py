@@ -11,10 +11,11 @@ LAST_CARD_NUMBER = 65
 
 
 def make(folder, path):
-    """Puts the numbered PNG pictures of a folder together into one: cards, then small to large."""
-    files = sorted(folder.glob("[0-9][0-9][0-9]_*.png"))
-    cards = [_open(file) for file in files if int(file.name[:3]) <= LAST_CARD_NUMBER]
-    others = [_open(file) for file in files if int(file.name[:3]) > LAST_CARD_NUMBER]
+    """Puts the PNG pictures of a folder together into one: cards, then small to large."""
+    files = sorted(folder.glob("*.png"))
+    card_files = [file for file in files if _is_card(file)]
+    cards = [_open(file) for file in card_files]
+    others = [_open(file) for file in files if file not in card_files]
     others.sort(key=lambda picture: picture.height)
 
     width = CARDS_TO_A_ROW * (cards[0].width + GAP) + GAP
@@ -25,6 +26,11 @@ def make(folder, path):
         sheet.paste(picture, place, picture)
     sheet = sheet.resize((sheet.width * SCALE, sheet.height * SCALE), Image.NEAREST)
     sheet.save(path, "PNG", optimize=False, compress_level=9)
+
+
+def _is_card(file):
+    number = file.name[:3]
+    return number.isdigit() and int(number) <= LAST_CARD_NUMBER
 
 
 def _open(file):

@@ -2,7 +2,7 @@
 
 from pathlib import Path
 
-from lettering import PLAIN, TINY
+from lettering import BOLD, TINY
 from pixels import Canvas, read_grids
 
 _SPADES = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "icons.txt")
@@ -53,7 +53,7 @@ def icon(size):
     corner, back, front, width, height, spade, index_face = {
         16: (1, (1, 1), (4, 2), 11, 13, 7, None),
         32: (3, (4, 3), (9, 5), 19, 24, 11, TINY),
-        48: (4, (7, 5), (14, 8), 27, 35, 17, PLAIN),
+        48: (4, (7, 5), (14, 8), 27, 35, 17, BOLD),
     }[size]
     tile = _felt(size, corner)
     _back(tile, *back, width, height)

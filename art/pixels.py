@@ -73,24 +73,11 @@ class Canvas:
                 if character != " ":
                     self.put(x + column, y + row, mapping[character])
 
-    def flipped_h(self):
-        """A mirror image: left becomes right."""
-        return self._rearranged(lambda x, y: (self.width - 1 - x, y))
-
-    def flipped_v(self):
-        """A mirror image: top becomes bottom."""
-        return self._rearranged(lambda x, y: (x, self.height - 1 - y))
-
     def rotated180(self):
-        return self._rearranged(lambda x, y: (self.width - 1 - x, self.height - 1 - y))
-
-    def part(self, x0, y0, x1, y1):
-        """A copy of a rectangle; x1 and y1 stand just outside it."""
-        cut = Canvas(x1 - x0, y1 - y0)
-        for y in range(y0, y1):
-            for x in range(x0, x1):
-                cut.put(x - x0, y - y0, self.get(x, y))
-        return cut
+        """A copy turned upside down."""
+        turned = Canvas(self.width, self.height)
+        turned._pixels = self._pixels[::-1]
+        return turned
 
     def colours(self):
         """The names of the colours used, in palette order."""
@@ -112,13 +99,6 @@ class Canvas:
         options = {"transparency": place[transparent]} if transparent in place else {}
         Path(path).parent.mkdir(parents=True, exist_ok=True)
         image.save(path, "PNG", optimize=False, compress_level=9, **options)
-
-    def _rearranged(self, source):
-        turned = Canvas(self.width, self.height)
-        for y in range(self.height):
-            for x in range(self.width):
-                turned.put(x, y, self.get(*source(x, y)))
-        return turned
 
 
 def read_grids(path):

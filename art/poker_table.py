@@ -102,11 +102,11 @@ def marquee(picture):
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
     for place in range(28):
-        for y in (top + 1, bottom - 4):
+        for y in (top, bottom - 3):
             bulb(picture, left + 2 + 8 * place, y, (place + (y > 20)) % 2 == 0)
     BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
     BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
-    nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 14, night(0), "brass_1", "gold_pale",
+    nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
                    ("gold_light", "gold", "brass_3"))
 
 
