@@ -24,7 +24,7 @@ def sign(canvas, x, y, name, colour):
 
 def strategy_button():
     button = raised(24, 22)
-    sign(button, 7, 4, "question", "card_red")
+    sign(button, 7, 4, "question", "sign_red")
     return button
 
 
@@ -40,7 +40,7 @@ def bet_button(name, live):
         sign(button, 4, 4, name, "black")
     else:
         sign(button, 5, 5, name, "white")
-        sign(button, 4, 4, name, "grey_80")
+        sign(button, 4, 4, name, "grey_70")
     return button
 
 

@@ -51,9 +51,11 @@ void CEditBox::OnPaint(CSurface& surface) {
   inner.DrawStencil(Point{kPadding - m_nScroll, top} + shift, stencil, kBlack);
   if (HasFocus()) {
     if (m_nCaret != m_nAnchor) {
+      // A pixel more on every side, so that no light letter touches the light box.
       const Rect marked =
           Rect{CaretX(SelectionStart()), top, CaretX(SelectionEnd()), top + kSystemFont.height}
-              .Moved(shift);
+              .Moved(shift)
+              .Shrunk(-1);
       inner.FillRect(marked, kHighlight);
       CSurface highlighted(pixels, marked.Common(pixels.Bounds()));
       const Point origin = marked.Common(pixels.Bounds()).TopLeft();

@@ -81,7 +81,7 @@ char MnemonicOf(const std::string& text) {
 
 CBitmap Greyed(const CBitmap& picture) {
   CBitmap greyed = CBitmap::SeeThrough(picture.GetSize());
-  CSurface(greyed).DrawStencil({}, picture, kShadowEdge);
+  CSurface(greyed).DrawStencil({}, picture, kDisabledSign);
   return greyed;
 }
 

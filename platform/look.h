@@ -9,7 +9,8 @@ inline constexpr Color kFaceColor = Rgb(212, 208, 200);
 inline constexpr Color kPressedColor = Rgb(184, 180, 172);
 inline constexpr Color kLightEdge = kWhite;
 inline constexpr Color kShadowEdge = Rgb(128, 128, 128);
-inline constexpr Color kDisabledText = Rgb(102, 100, 96);
+inline constexpr Color kDisabledText = Rgb(88, 86, 82);
+inline constexpr Color kDisabledSign = Rgb(112, 112, 112);
 inline constexpr Color kHighlight = Rgb(10, 36, 106);
 
 /// The type of bars, menus and dialogs.

@@ -90,7 +90,9 @@ void CSlider::OnLButtonDown(Point p) {
 }
 
 void CSlider::OnMouseMove(Point p) {
-  if (m_bDragging) MoveTo(PosAt(p.y - m_nGrip));
+  const int row = p.y - m_nGrip;
+  // Several positions share a row: within it the thumb has not moved.
+  if (m_bDragging && row != ThumbMiddle(m_nPos).y) MoveTo(PosAt(row));
 }
 
 void CSlider::OnPressLost() {

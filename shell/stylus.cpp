@@ -149,7 +149,7 @@ bool CStylus::OnIdle() {
   std::string line;
   do {
     if (!std::getline(m_in, line)) return false;
-  } while (line.find_first_not_of(" \t\r") == std::string::npos || line[0] == '#');
+  } while (line.empty() || line[0] == '#');
   Interpret(line);
   return true;
 }
