@@ -35,7 +35,8 @@ void CCheckBox::OnPaint(CSurface& surface) {
     y += kSystemFont.height;
   }
   if (HasFocus()) {
-    DrawFocusRect(surface, {kTextLeft - 2, top, kTextLeft + widest + 2, top + height});
+    const int right = std::min(client.right, kTextLeft + widest + 2);
+    DrawFocusRect(surface, {kTextLeft - 2, top, right, top + height});
   }
 }
 

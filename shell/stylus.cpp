@@ -108,7 +108,7 @@ const std::vector<CStylus::Command>& CStylus::Commands() {
       {"touch", 2, 2, &CStylus::Touch},
       {"command", 1, 1, &CStylus::ChooseCommand},
       {"key", 1, 1, &CStylus::PressKey},
-      {"type", 1, kAnyNumber, &CStylus::Type},
+      {"type", 0, kAnyNumber, &CStylus::Type},
       {"press", 1, 1, &CStylus::Press},
       {"select", 2, 2, &CStylus::Select},
       {"slide", 2, 2, &CStylus::Slide},
@@ -247,9 +247,12 @@ void CStylus::PressKey(const Words& words) {
 }
 
 void CStylus::Type(const Words& words) {
+  // The text begins one blank behind the name and may consist of blanks.
+  const std::size_t start = words[0].find("type") + std::string("type ").size();
+  if (words[0].size() <= start) throw CommandError("nothing to type");
   platform::InputEvent event;
   event.kind = platform::InputKind::kText;
-  event.text = words[0].substr(words[0].find("type") + 5);
+  event.text = words[0].substr(start);
   m_host.PutInput(event);
 }
 

@@ -6,7 +6,6 @@ libraries behind the layer. Names each line that crosses a border; exits with 1 
 """
 
 import re
-import subprocess
 import sys
 from pathlib import Path
 
@@ -49,11 +48,10 @@ LIBRARY_NAME = re.compile(r"\b(?:SDL|TTF|png)_\w+|\btoml::\w+")
 
 
 def source_files():
-    """What git knows or would add, as paths from the root."""
-    listed = subprocess.run(
-        ["git", "ls-files", "--cached", "--others", "--exclude-standard", "*.h", "*.cpp"],
-        cwd=ROOT, capture_output=True, text=True, check=True).stdout.split()
-    return sorted(path for path in set(listed) if (ROOT / path).is_file())
+    """All headers and sources of ours, as paths from the root."""
+    found = (path.relative_to(ROOT).as_posix()
+             for ending in ("h", "cpp") for path in ROOT.glob(f"*/**/*.{ending}"))
+    return sorted(path for path in found if not path.startswith("build/"))
 
 
 def includes_of(text):
