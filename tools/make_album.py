@@ -20,9 +20,9 @@ from scenes import ROOT, SCALE, indexed, open_stylus, save, take
 DOCS = ROOT / "docs"
 
 # What is left of red, green and blue (linear) where one kind of cone is missing. The figures are
-# those for severity 1.0 in G. M. Machado, M. M. Oliveira, L. A. F. Fernandes: A Physiologically-based
-# Model for Simulation of Color Vision Deficiency, IEEE Transactions on Visualization and Computer
-# Graphics 15 (6), 2009.
+# those for severity 1.0 in G. M. Machado, M. M. Oliveira, L. A. F. Fernandes: A Physiologically-
+# based Model for Simulation of Color Vision Deficiency, IEEE Transactions on Visualization and
+# Computer Graphics 15 (6), 2009.
 VISIONS = {
     "protanopia": ((0.152286, 1.052583, -0.204868),
                    (0.114503, 0.786281, 0.099216),

@@ -92,7 +92,7 @@ def take(stylus, scene):
 
 
 def indexed(picture):
-    """The same picture with a palette, every colour exactly as it was; None for too many colours."""
+    """The same picture with a palette, every colour just as it was; None for too many colours."""
     found = picture.getcolors(256)
     if found is None:
         return None

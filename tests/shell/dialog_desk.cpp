@@ -123,8 +123,9 @@ void DialogDesk::Type(const std::string& text) {
   ProgramThread::The().Resume();
 }
 
-void DialogDesk::Keys(const std::vector<std::string>& strokes) {
-  for (const std::string& stroke : strokes) {
+void DialogDesk::Keys(const std::string& strokes) {
+  std::istringstream words(strokes);
+  for (std::string stroke; words >> stroke;) {
     if (stroke[0] == '\'') {
       Type(stroke.substr(1));
     } else {
@@ -170,6 +171,13 @@ WriteWatch::WriteWatch() { g_writes.emplace(); }
 WriteWatch::~WriteWatch() { g_writes.reset(); }
 
 std::vector<std::string> WriteWatch::Take() { return std::exchange(g_writes.value(), {}); }
+
+Json ControlOf(const Json& state, int number) {
+  for (const Json& control : state["controls"]) {
+    if (control["number"] == number) return control;
+  }
+  return {};
+}
 
 std::vector<std::string> SettingsIn(const std::string& profile) {
   std::vector<std::string> lines;

@@ -35,8 +35,8 @@ class DialogDesk {
   void Tap(platform::Point at);
   void Wheel(platform::Point at, int notches);
   void Type(const std::string& text);
-  /// Chords; what begins with an apostrophe is typed instead.
-  void Keys(const std::vector<std::string>& strokes);
+  /// Chords with blanks between them; what begins with an apostrophe is typed instead.
+  void Keys(const std::string& strokes);
   void Wallet(double dollars);
 
   /// Titles, bottom to top; an open list has none.
@@ -70,6 +70,9 @@ class WriteWatch {
   /// The written files without their section's heading, oldest first, since the last call.
   std::vector<std::string> Take();
 };
+
+/// A control in the state of the topmost dialog.
+Json ControlOf(const Json& state, int number);
 
 /// The lines of a profile without its section's heading.
 std::vector<std::string> SettingsIn(const std::string& profile);

@@ -39,13 +39,6 @@ Entries KeptIn(const Stylus& stylus) {
   return entries;
 }
 
-Json ControlOf(const Json& state, int number) {
-  for (const Json& control : state["controls"]) {
-    if (control["number"] == number) return control;
-  }
-  return {};
-}
-
 /// What stands on the dialog's five lines.
 Entries Shown(const Json& state) {
   Entries lines;

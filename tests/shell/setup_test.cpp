@@ -99,7 +99,8 @@ const std::vector<SetupCase> kSetupCases = {
     {{"command 32776", kTableSetup, "press 1010"}, {{"m_pPokerBitmap", 1}}, {}, "GAME_TYPE = 1"},
     {{"command 32776", kTableSetup, "press 1010", "press 1"},
      {{"m_bFancyPoker", 0}, {"m_pPokerBitmap", 0}},
-     {},
+     {"BOXCOLOR = 6599815", "CARDBACK = 54", "FANCYBJ = 1", "FANCYVP = 0", "GAME_TYPE = 1",
+      "TABLECOLOR = 39680", "USEHIGH = 1", "VIDEODISCARDS = 3"},
      "GAME_TYPE = 1"},
 };
 
@@ -124,18 +125,18 @@ TEST(Setup, WritesItsValuesInTheirOrder) {
   for (int round = 0; round < 2; ++round) {  // unchanged values are written again
     desk.Command(32777);
     EXPECT_THAT(writes.Take(), IsEmpty());
-    desk.Keys({"Tab", "Tab", "Enter"});  // a focused button would take Enter for itself
+    desk.Keys("Tab Tab Enter");  // a focused button would take Enter for itself
     EXPECT_THAT(writes.Take(),
                 ElementsAre("TABLECOLOR = 39680", "BOXCOLOR = 6599815", "CARDBACK = 54",
                             "VIDEODISCARDS = 3", "FANCYVP = 1", "FANCYBJ = 1", "USEHIGH = 1"));
   }
   for (const int commandID : {32777, 32779}) {
     desk.Command(commandID);
-    desk.Keys({"Escape"});
+    desk.Keys("Escape");
   }
   EXPECT_THAT(writes.Take(), IsEmpty());
   desk.Command(32779);
-  desk.Keys({"Enter"});
+  desk.Keys("Enter");
   EXPECT_THAT(writes.Take(),
               ElementsAre("STRATTYPE = 1", "GAME_TYPE = 0", "NUMDECKS = 1", "PLAYSPEED = 1"));
 }
@@ -187,7 +188,7 @@ TEST(Setup, ShowsTheEditedColorInSampleNumberAndSwatch) {
   EXPECT_EQ(desk.Control(6003).GetText(), "0");
   EXPECT_EQ(desk.Control(6004).GetText(), "255");
   EXPECT_EQ(desk.Control(6005).GetText(), "0");
-  desk.Keys({"Enter"});
+  desk.Keys("Enter");
   EXPECT_EQ(color(desk.Middle(1501)), 65280U);
 }
 
