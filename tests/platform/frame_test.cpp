@@ -233,7 +233,7 @@ TEST(KeyStrokes, AreNamedByChords) {
   using platform::Key;
   using platform::KeyStroke;
   struct Case {
-    const char* chord;
+    const char* chord = nullptr;
     KeyStroke stroke;
   };
   for (const Case& c : {Case{"Enter", {Key::kEnter, 0, false, false, false}},

@@ -12,7 +12,6 @@
 namespace feltside::tests {
 namespace {
 
-using platform::CBitmap;
 using platform::Color;
 using platform::Rgb;
 using platform::Size;
@@ -97,7 +96,7 @@ TEST(Pictures, HaveCellsForTheTextsOfVideoPoker) {
   ASSERT_TRUE(picture.has_value());
   struct Cell {
     platform::Rect rect;
-    Color color;
+    Color color = platform::kBlack;
   };
   // As much as a text of the usual length covers.
   for (const Cell& cell :

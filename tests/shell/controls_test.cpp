@@ -12,7 +12,6 @@ namespace {
 using platform::Point;
 using platform::Rect;
 using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::SizeIs;
 
 constexpr int kExit = 57665;

@@ -14,7 +14,6 @@ namespace feltside::tests {
 namespace {
 
 using platform::CControl;
-using platform::Point;
 using platform::Rect;
 
 struct Scene {
@@ -66,7 +65,7 @@ class Stage : public DialogDesk {
                std::max(place.right, other.right), std::max(place.bottom, other.bottom)};
     }
     platform::CBitmap front({place.Width(), place.Height()});
-    platform::CSurface(front).BitBlt(Point{} - place.TopLeft(), Shown().GetSize(), Shown());
+    platform::CSurface(front).BitBlt({}, front.GetSize(), Shown(), place.TopLeft());
     return front;
   }
 };

@@ -77,24 +77,19 @@ std::string Player::NextCommand(const Json& state) {
   return WithAControl(controls[m_random() % controls.size()]);
 }
 
-/// What the settings and the dialog on top may not be.
+/// What of the settings is out of its range.
 std::string WrongIn(const Json& state) {
   std::string wrong;
-  const auto limit = [&](const std::string& what, const Json& value, int least, int most) {
-    if (value < least || value > most) wrong += what + " is " + value.dump() + "\n";
+  const auto limit = [&wrong](const Json& value, int least, int most) {
+    if (value < least || value > most) wrong += value.dump() + " ";
   };
-  limit("game", state["m_nGameType"], 0, 1);
-  limit("strategy", state["m_nStrategyMode"], 0, 2);
-  limit("decks", state["m_nDeckChoice"], 0, 2);
-  limit("delay", state["m_nDealerDelay"], 200, 2000);
-  limit("discards", state["m_nMaxDiscards"], 3, 5);
-  limit("card back", state["m_layout"]["m_nCardBackID"], 54, 65);
-  limit("colour", state["m_layout"]["m_crTable"], 0, 0xFFFFFF);
-  limit("windows", static_cast<int>(state["windows"].size()), 1, 4);
-  for (const Json& control : state["controls"]) {
-    limit(control.dump(), control["rect"][0], 0, 240);
-    limit(control.dump(), control["rect"][3], 0, 294);
-  }
+  limit(state["m_nGameType"], 0, 1);
+  limit(state["m_nStrategyMode"], 0, 2);
+  limit(state["m_nDeckChoice"], 0, 2);
+  limit(state["m_nDealerDelay"], 200, 2000);
+  limit(state["m_nMaxDiscards"], 3, 5);
+  limit(state["m_layout"]["m_nCardBackID"], 54, 65);
+  limit(state["m_layout"]["m_crTable"], 0, 0xFFFFFF);
   return wrong;
 }
 

@@ -81,7 +81,7 @@ TEST(Insurance, IsAnsweredOnItsButtonsOnly) {
     stylus.Send(kDeal);
     const Json state = stylus.Send(input);
     const bool open = state["m_bInsuranceOffered"] == 1;
-    const std::string answer = open ? "open" : state["m_bInsuranceTaken"] == 1 ? "yes" : "no";
+    std::string answer = open ? "open" : state["m_bInsuranceTaken"] == 1 ? "yes" : "no";
     stylus.Send("key N");
     stylus.Send(kStand);
     return answer;
