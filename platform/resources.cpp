@@ -1,6 +1,7 @@
 #include "platform/resources.h"
 
 #include <cstdio>
+#include <utility>
 
 #include "platform/look.h"
 
@@ -37,17 +38,24 @@ const CBitmap& CResources::LoadIcon(int resourceID, Size blank) {
   return Load("icon_", resourceID, blank);
 }
 
+CBitmap CResources::ReadBitmap(int resourceID, Size blank) const {
+  return Read(FilePrefix("", resourceID), resourceID, blank);
+}
+
 const CBitmap& CResources::Load(const std::string& kind, int resourceID, Size blank) {
   const std::string prefix = FilePrefix(kind, resourceID);
   const auto loaded = m_mapLoaded.find(prefix);
   if (loaded != m_mapLoaded.end()) return loaded->second;
-  std::optional<CBitmap> picture;
+  return m_mapLoaded.emplace(prefix, Read(prefix, resourceID, blank)).first->second;
+}
+
+CBitmap CResources::Read(const std::string& prefix, int resourceID, Size blank) const {
   for (const EmbeddedFile& file : m_files) {
     if (!StartsWith(file.name, prefix)) continue;
-    picture = DecodePicture(file);
+    if (std::optional<CBitmap> picture = DecodePicture(file)) return std::move(*picture);
     break;
   }
-  return m_mapLoaded.emplace(prefix, picture ? *picture : Blank(blank, resourceID)).first->second;
+  return Blank(blank, resourceID);
 }
 
 std::optional<CBitmap> CResources::LoadIconOfSize(int resourceID, int width) const {

@@ -18,6 +18,8 @@ class CResources {
   /// The bitmap of that number. Where there is none, or it cannot be decoded: a framed blank of the
   /// given size that bears the number, the same from then on.
   const CBitmap& LoadBitmap(int resourceID, Size blank);
+  /// The same for who keeps it: decoded for this call alone.
+  CBitmap ReadBitmap(int resourceID, Size blank) const;
   /// The icon of that number, with the same rule.
   const CBitmap& LoadIcon(int resourceID, Size blank);
   /// The picture of an icon that comes in several sizes, by its width in pixels; nothing where it
@@ -25,7 +27,8 @@ class CResources {
   std::optional<CBitmap> LoadIconOfSize(int resourceID, int width) const;
 
  private:
-  const CBitmap& Load(const std::string& prefix, int resourceID, Size blank);
+  const CBitmap& Load(const std::string& kind, int resourceID, Size blank);
+  CBitmap Read(const std::string& prefix, int resourceID, Size blank) const;
 
   EmbeddedFiles m_files;
   std::map<std::string, CBitmap> m_mapLoaded;

@@ -1,12 +1,14 @@
 #include "platform/text.h"
 
-#include <SDL_ttf.h>
+#include <freetype/freetype.h>
 
 #include <algorithm>
 #include <array>
 #include <cstddef>
+#include <cstdint>
 #include <cstdlib>
-#include <memory>
+#include <map>
+#include <vector>
 
 #include "platform/embedded.h"
 #include "platform/utf8.h"
@@ -24,6 +26,11 @@ constexpr std::array<FaceSize, 5> kFaceSizes = {{{11, 9}, {13, 11}, {14, 12}, {1
 /// At this height the bold face looks like the normal one, so bold is the normal face struck twice.
 constexpr int kStruckTwiceHeight = 11;
 
+/// The type library counts in parts of a pixel: from those to whole pixels, down and up.
+constexpr FT_Pos kPartsOfPixel = 64;
+int Floor(FT_Pos parts) { return static_cast<int>(parts >> 6); }
+int Ceiling(FT_Pos parts) { return Floor(parts + kPartsOfPixel - 1); }
+
 std::size_t NearestFace(int height) {
   const auto nearest =
       std::min_element(kFaceSizes.begin(), kFaceSizes.end(), [height](FaceSize a, FaceSize b) {
@@ -32,42 +39,95 @@ std::size_t NearestFace(int height) {
   return static_cast<std::size_t>(nearest - kFaceSizes.begin());
 }
 
-/// The opened faces, each read once at its first use.
-class FaceCache {
- public:
-  FaceCache() { TTF_Init(); }
-  ~FaceCache() {
-    for (TTF_Font* face : m_arrFaces) {
-      if (face != nullptr) TTF_CloseFont(face);
-    }
-    TTF_Quit();
-  }
-  FaceCache(const FaceCache&) = delete;
-  FaceCache& operator=(const FaceCache&) = delete;
+/// A letter of a face as it was drawn: where its ink stands, seen from the pen on the cell's top.
+struct Letter {
+  FT_UInt glyph = 0;
+  FT_Pos advance = 0;
+  int left = 0;
+  int right = 0;  ///< where the ink ends
+  std::vector<Point> ink;
+};
 
-  TTF_Font* Face(std::size_t size, bool bold) {
-    TTF_Font*& face = m_arrFaces[size * 2 + (bold ? 1 : 0)];
-    if (face == nullptr) face = Open(size, bold);
-    return face;
+/// A face at one size, which may not have been readable: then its letters are empty.
+class Face {
+ public:
+  Face(FT_Library library, const EmbeddedFile* file, int points) {
+    if (file == nullptr || FT_New_Memory_Face(library, file->data, static_cast<FT_Long>(file->size),
+                                              0, &m_face) != 0) {
+      return;
+    }
+    FT_Set_Char_Size(m_face, 0, points * kPartsOfPixel, 0, 0);
+    m_nAscent = Ceiling(FT_MulFix(m_face->ascender, m_face->size->metrics.y_scale));
+  }
+
+  /// Each letter is drawn once.
+  const Letter& Find(char32_t character) {
+    const auto known = m_mapLetters.find(character);
+    return known != m_mapLetters.end()
+               ? known->second
+               : m_mapLetters.emplace(character, Draw(character)).first->second;
+  }
+
+  FT_Pos Kerning(const Letter& first, const Letter& second) const {
+    FT_Vector kerning{};
+    if (m_face != nullptr) {
+      FT_Get_Kerning(m_face, first.glyph, second.glyph, FT_KERNING_UNFITTED, &kerning);
+    }
+    return kerning.x;
   }
 
  private:
-  static TTF_Font* Open(std::size_t size, bool bold) {
-    const EmbeddedFile* file =
-        FindEmbedded(FontFiles(), bold ? "LiberationSans-Bold.ttf" : "LiberationSans-Regular.ttf");
-    if (file == nullptr) return nullptr;
-    SDL_RWops* data = SDL_RWFromConstMem(file->data, static_cast<int>(file->size));
-    TTF_Font* face = TTF_OpenFontRW(data, 1, kFaceSizes[size].points);
-    if (face != nullptr) TTF_SetFontHinting(face, TTF_HINTING_MONO);
-    return face;
+  Letter Draw(char32_t character) {
+    Letter letter;
+    if (m_face == nullptr) return letter;
+    letter.glyph = FT_Get_Char_Index(m_face, character);
+    constexpr FT_Int32 kOneBit = FT_LOAD_RENDER | FT_LOAD_TARGET_MONO;
+    if (FT_Load_Glyph(m_face, letter.glyph, kOneBit) != 0) return letter;
+    const FT_GlyphSlotRec& drawn = *m_face->glyph;
+    letter.advance = drawn.advance.x;
+    letter.left = drawn.bitmap_left;
+    letter.right = letter.left + static_cast<int>(drawn.bitmap.width);
+    for (int y = 0; y < static_cast<int>(drawn.bitmap.rows); ++y) {
+      for (int x = 0; x < static_cast<int>(drawn.bitmap.width); ++x) {
+        const unsigned eight = drawn.bitmap.buffer[y * drawn.bitmap.pitch + x / 8];
+        if ((eight >> (7 - x % 8) & 1U) == 0) continue;
+        letter.ink.push_back({letter.left + x, m_nAscent - drawn.bitmap_top + y});
+      }
+    }
+    return letter;
   }
 
-  std::array<TTF_Font*, kFaceSizes.size() * 2> m_arrFaces{};
+  FT_Face m_face = nullptr;
+  int m_nAscent = 0;
+  std::map<char32_t, Letter> m_mapLetters;
+};
+
+/// The opened faces, each read once at its first use.
+class FaceCache {
+ public:
+  FaceCache() { FT_Init_FreeType(&m_library); }
+  /// The library closes its faces itself.
+  ~FaceCache() { FT_Done_FreeType(m_library); }
+  FaceCache(const FaceCache&) = delete;
+  FaceCache& operator=(const FaceCache&) = delete;
+
+  Face& Find(std::size_t size, bool bold) {
+    const std::size_t number = size * 2 + (bold ? 1 : 0);
+    const auto known = m_mapFaces.find(number);
+    if (known != m_mapFaces.end()) return known->second;
+    const EmbeddedFile* file =
+        FindEmbedded(FontFiles(), bold ? "LiberationSans-Bold.ttf" : "LiberationSans-Regular.ttf");
+    return m_mapFaces.emplace(number, Face(m_library, file, kFaceSizes[size].points)).first->second;
+  }
+
+ private:
+  FT_Library m_library = nullptr;
+  std::map<std::size_t, Face> m_mapFaces;
 };
 
 /// A face as it is asked for: which opened face, and whether it is struck twice.
 struct ChosenFace {
-  TTF_Font* face;
+  Face& face;
   int cellHeight;
   bool struckTwice;
 };
@@ -77,82 +137,58 @@ ChosenFace Choose(const Font& font) {
   const std::size_t size = NearestFace(font.height);
   const int height = kFaceSizes[size].cellHeight;
   const bool twice = font.bold && height == kStruckTwiceHeight;
-  return {cache.Face(size, font.bold && !twice), height, twice};
+  return {cache.Find(size, font.bold && !twice), height, twice};
 }
 
-using SurfacePtr = std::unique_ptr<SDL_Surface, decltype(&SDL_FreeSurface)>;
-
-void Strike(const SDL_Surface& glyphs, int shift, CBitmap& stencil) {
-  const int height = std::min(glyphs.h, stencil.GetSize().height);
-  const int width = std::min(glyphs.w, stencil.GetSize().width - shift);
-  for (int y = 0; y < height; ++y) {
-    const auto offset = static_cast<std::ptrdiff_t>(y) * glyphs.pitch;
-    const auto* row = static_cast<const Uint8*>(glyphs.pixels) + offset;
-    for (int x = 0; x < width; ++x) {
-      if (row[x] != 0) stencil.At({x + shift, y}) = ToPixel(kBlack);
-    }
-  }
-}
-
-/// The letters of a text, each with its own width and the extra pixel that striking it twice takes.
+/// Goes through a text and tells, for each letter, where the pen stands in pixels and where the
+/// text goes on in bytes; answers where the pen stands at the end. Ink never begins before 0. A
+/// face struck twice has no kerning, and a pixel more for each letter.
 template <class LetterRule>
-void EachLetter(TTF_Font* face, const std::string& text, LetterRule rule) {
-  int left = 0;
-  for (std::size_t at = 0; at < text.size();) {
-    const std::size_t next = NextLetter(text, at);
-    const std::string letter = text.substr(at, next - at);
-    int width = 0;
-    TTF_SizeUTF8(face, letter.c_str(), &width, nullptr);
-    rule(letter, left);
-    left += width + 1;
-    at = next;
+int EachLetter(const ChosenFace& chosen, const std::string& text, LetterRule rule) {
+  FT_Pos pen = 0;
+  const Letter* previous = nullptr;
+  for (std::size_t at = 0, next = 0; at < text.size(); at = next) {
+    next = NextLetter(text, at);
+    const Letter& letter = chosen.face.Find(CharacterAt(text, at));
+    if (previous != nullptr && !chosen.struckTwice) pen += chosen.face.Kerning(*previous, letter);
+    if (previous == nullptr || chosen.struckTwice) pen += std::max(0, -letter.left) * kPartsOfPixel;
+    rule(letter, Floor(pen), next);
+    pen += letter.advance + (chosen.struckTwice ? kPartsOfPixel : 0);
+    previous = &letter;
   }
-  rule("", left);
-}
-
-SurfacePtr Render(TTF_Font* face, const std::string& text) {
-  return {TTF_RenderUTF8_Solid(face, text.c_str(), SDL_Color{}), &SDL_FreeSurface};
+  return Floor(pen);
 }
 
 }  // namespace
 
 Size MeasureText(const Font& font, const std::string& text) {
   const ChosenFace chosen = Choose(font);
-  int width = 0;
-  if (!text.empty() && chosen.face != nullptr) {
-    if (chosen.struckTwice) {
-      EachLetter(chosen.face, text, [&width](const std::string&, int left) { width = left; });
-    } else {
-      TTF_SizeUTF8(chosen.face, text.c_str(), &width, nullptr);
-    }
-  }
-  return {width, chosen.cellHeight};
+  int inkEnd = 0;
+  const int pen = EachLetter(chosen, text, [&inkEnd](const Letter& letter, int at, std::size_t) {
+    inkEnd = at + letter.right;
+  });
+  return {std::max(pen, inkEnd), chosen.cellHeight};
 }
 
 std::size_t FittingLength(const Font& font, const std::string& text, int width) {
-  const ChosenFace chosen = Choose(font);
-  int extent = 0;
-  int letters = 0;
-  if (chosen.face == nullptr || text.empty() || width <= 0) return 0;
-  TTF_MeasureUTF8(chosen.face, text.c_str(), width, &extent, &letters);
-  std::size_t at = 0;
-  for (int i = 0; i < letters; ++i) at = NextLetter(text, at);
-  return at;
+  std::size_t fitting = 0;
+  EachLetter(Choose(font), text, [&](const Letter& letter, int pen, std::size_t next) {
+    if (pen + std::max(Floor(letter.advance), letter.right) <= width) fitting = next;
+  });
+  return fitting;
 }
 
 CBitmap RenderText(const Font& font, const std::string& text) {
-  const ChosenFace chosen = Choose(font);
   CBitmap stencil = CBitmap::SeeThrough(MeasureText(font, text));
-  if (text.empty() || chosen.face == nullptr) return stencil;
-  if (!chosen.struckTwice) {
-    if (const SurfacePtr glyphs = Render(chosen.face, text)) Strike(*glyphs, 0, stencil);
-    return stencil;
-  }
-  EachLetter(chosen.face, text, [&](const std::string& letter, int left) {
-    const SurfacePtr glyph = Render(chosen.face, letter);
-    if (glyph == nullptr) return;
-    Strike(*glyph, left, stencil);
-    Strike(*glyph, left + 1, stencil);
+  const ChosenFace chosen = Choose(font);
+  const auto strike = [&stencil](Point at) {
+    if (stencil.Bounds().Contains(at)) stencil.At(at) = ToPixel(kBlack);
+  };
+  EachLetter(chosen, text, [&](const Letter& letter, int pen, std::size_t) {
+    for (const Point& ink : letter.ink) {
+      strike({pen + ink.x, ink.y});
+      if (chosen.struckTwice) strike({pen + ink.x + 1, ink.y});
+    }
   });
   return stencil;
 }

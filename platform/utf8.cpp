@@ -47,6 +47,17 @@ std::size_t NextLetter(const std::string& text, std::size_t at) {
   return at;
 }
 
+char32_t CharacterAt(const std::string& text, std::size_t at) {
+  constexpr char32_t kNoCharacter = 0xFFFD;
+  const std::size_t length = LetterLength(text, at);
+  if (length == 0) return kNoCharacter;
+  char32_t character = length == 1 ? ByteAt(text, at) : ByteAt(text, at) & (0x7FU >> length);
+  for (std::size_t i = 1; i < length; ++i) {
+    character = character << 6 | (ByteAt(text, at + i) & 0x3F);
+  }
+  return character;
+}
+
 std::string OneLine(const std::string& text) {
   std::string line;
   for (std::size_t at = 0; at < text.size();) {

@@ -11,7 +11,7 @@ namespace {
 void LoadOnce(std::unique_ptr<platform::CBitmap>& picture, int bitmapID, platform::Size size) {
   if (picture != nullptr) return;
   picture = std::make_unique<platform::CBitmap>(
-      platform::TheApp().Resources().LoadBitmap(bitmapID, size));
+      platform::TheApp().Resources().ReadBitmap(bitmapID, size));
 }
 
 }  // namespace

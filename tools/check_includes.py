@@ -36,7 +36,7 @@ JSON = r"nlohmann/.*"
 # The same for the headers of libraries.
 LIBRARIES = [
     (r"platform/sdl_\w+\.h", SDL),
-    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|toml\\+\\+/.*|{SYSTEM}"),
+    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|freetype/.*|toml\\+\\+/.*|{SYSTEM}"),
     (r"shell/.*", JSON),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|dlfcn\\.h"),
@@ -44,7 +44,7 @@ LIBRARIES = [
 ]
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
-LIBRARY_NAME = re.compile(r"\b(?:SDL|TTF|png)_\w+|\btoml::\w+")
+LIBRARY_NAME = re.compile(r"\b(?:SDL|FT|png)_\w+|\btoml::\w+")
 
 
 def source_files():

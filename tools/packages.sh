@@ -13,7 +13,7 @@ play_packages='
   g++                  command  c++
   pkg-config           command  pkg-config
   libsdl2-dev          module   sdl2
-  libsdl2-ttf-dev      module   SDL2_ttf
+  libfreetype-dev      module   freetype2
   libpng-dev           module   libpng
   libtomlplusplus-dev  module   tomlplusplus
   nlohmann-json3-dev   module   nlohmann_json
