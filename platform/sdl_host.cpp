@@ -1,6 +1,9 @@
 #include "platform/sdl_host.h"
 
 #include <SDL.h>
+#ifdef __GLIBC__
+#include <malloc.h>
+#endif
 
 #include <ctime>
 #include <string_view>
@@ -160,9 +163,19 @@ bool SdlHost::TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event) {
   return event.stroke.key != Key::kNone && (key.repeat == 0 || ActsWhileHeld(event.stroke.key));
 }
 
+/// A frame is composed in a block of its own at every paint. The memory of such blocks goes back to
+/// the system at once, rather than staying with the process between paints.
+void ReturnLargeBlocks() {
+#ifdef __GLIBC__
+  constexpr int kLargeBlock = 128 * 1024;
+  mallopt(M_MMAP_THRESHOLD, kLargeBlock);
+#endif
+}
+
 }  // namespace
 
 std::unique_ptr<Host> CreateSdlHost(Size frameSize, std::string& why) {
+  ReturnLargeBlocks();
   auto video = std::make_unique<SdlVideo>();
   if (!video->HasDisplay()) {
     why = "There is no display to show a window on.";

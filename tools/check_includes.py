@@ -36,7 +36,7 @@ JSON = r"nlohmann/.*"
 # The same for the headers of libraries.
 LIBRARIES = [
     (r"platform/sdl_\w+\.h", SDL),
-    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|freetype/.*|toml\\+\\+/.*|{SYSTEM}"),
+    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|malloc\\.h|freetype/.*|toml\\+\\+/.*|{SYSTEM}"),
     (r"shell/.*", JSON),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|dlfcn\\.h"),
