@@ -17,6 +17,7 @@ class CComboBox : public CControl {
 
   const char* KindName() const override { return "list"; }
   bool IsTabStop() const override { return true; }
+  char Mnemonic() const override { return 0; }
   /// The place of the choice; -1 for none.
   int GetValue() const override { return m_nChoice; }
   int GetItemCount() const { return static_cast<int>(m_arrItems.size()); }

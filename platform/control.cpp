@@ -4,6 +4,7 @@
 #include "platform/combo_box.h"
 #include "platform/dialog.h"
 #include "platform/edit_box.h"
+#include "platform/look.h"
 #include "platform/push_button.h"
 #include "platform/slider.h"
 #include "platform/static_controls.h"
@@ -21,6 +22,8 @@ void CControl::SetText(const std::string& text) {
   m_strText = text;
   Invalidate();
 }
+
+char CControl::Mnemonic() const { return MnemonicOf(m_strText); }
 
 bool CControl::HasFocus() { return m_dialog.GetFocus() == this; }
 

@@ -25,6 +25,8 @@ class CControl : public CWindow {
   /// What the control is, in a word.
   virtual const char* KindName() const = 0;
 
+  /// The letter that activates the control, as a capital; 0 for none.
+  virtual char Mnemonic() const;
   /// Whether Tab stops here.
   virtual bool IsTabStop() const { return false; }
   /// Whether a letter typed here is text, so that it may not choose a control by its mnemonic.

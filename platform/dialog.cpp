@@ -177,7 +177,7 @@ bool CDialog::PushDefault() {
 
 bool CDialog::ActivateByLetter(char letter) {
   for (const auto& control : m_arrControls) {
-    if (letter == 0 || MnemonicOf(control->GetText()) != letter) continue;
+    if (letter == 0 || control->Mnemonic() != letter) continue;
     if (!control->IsVisible() || !control->IsEnabled()) continue;
     if (control->IsTabStop()) SetFocus(control.get());
     control->Activate();
@@ -201,6 +201,7 @@ bool CDialog::OnKeyDown(const KeyStroke& stroke) {
       if (HasHelp()) OnHelp();
       return true;
     case Key::kCharacter:
+      if (stroke.ctrl) return false;
       if (!stroke.alt && focus != nullptr && focus->WantsLetters()) return false;
       return ActivateByLetter(stroke.character);
     default:

@@ -43,12 +43,16 @@ void CEditBox::OnPaint(CSurface& surface) {
   const Rect client = GetClientRect();
   DrawBox(surface, kWhite);
   const int top = TextTop(client);
-  const CBitmap stencil = RenderText(kSystemFont, GetText());
+  // Of a long text only the piece around the box is drawn.
+  const std::size_t from = FittingLength(kSystemFont, GetText(), m_nScroll - kPadding);
+  const std::string rest = GetText().substr(from);
+  const CBitmap stencil =
+      RenderText(kSystemFont, rest.substr(0, FittingLength(kSystemFont, rest, 2 * client.right)));
   // What is drawn within the border must not run over it.
   CBitmap pixels({client.right - 2, client.bottom - 2}, kWhite);
   CSurface inner(pixels);
   const Point shift{-1, -1};
-  inner.DrawStencil(Point{kPadding - m_nScroll, top} + shift, stencil, kBlack);
+  inner.DrawStencil(Point{CaretX(from), top} + shift, stencil, kBlack);
   if (HasFocus()) {
     if (m_nCaret != m_nAnchor) {
       // A pixel more on every side, so that no light letter touches the light box.
@@ -59,7 +63,7 @@ void CEditBox::OnPaint(CSurface& surface) {
       inner.FillRect(marked, kHighlight);
       CSurface highlighted(pixels, marked.Common(pixels.Bounds()));
       const Point origin = marked.Common(pixels.Bounds()).TopLeft();
-      highlighted.DrawStencil(Point{kPadding - m_nScroll, top} + shift - origin, stencil, kWhite);
+      highlighted.DrawStencil(Point{CaretX(from), top} + shift - origin, stencil, kWhite);
     }
     const int x = CaretX(m_nCaret) - 1 + shift.x;
     inner.FillRect({x, top - 2, x + 1, top + kSystemFont.height}, kBlack);
@@ -115,7 +119,7 @@ void CEditBox::Erase(bool forwards) {
 }
 
 bool CEditBox::OnKeyDown(const KeyStroke& stroke) {
-  if (stroke.alt && stroke.key != Key::kBackspace) return false;
+  if (stroke.alt) return false;
   if (OnMoveKey(stroke) || OnClipboardKey(stroke)) return true;
   if (stroke.key == Key::kBackspace || stroke.key == Key::kDelete) {
     Erase(stroke.key == Key::kDelete);

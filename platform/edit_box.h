@@ -16,6 +16,7 @@ class CEditBox : public CControl {
   bool IsTabStop() const override { return true; }
   bool WantsLetters() const override { return true; }
   void SetText(const std::string& text) override;
+  char Mnemonic() const override { return 0; }
   void Activate() override { TakeFocus(); }
 
   void OnPaint(CSurface& surface) override;

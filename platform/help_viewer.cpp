@@ -6,6 +6,7 @@
 #include <unistd.h>
 
 #include <array>
+#include <cerrno>
 #include <iostream>
 #include <system_error>
 
@@ -31,11 +32,12 @@ fs::path HelpFolder() {
 void OpenDetached(const std::string& address) {
   const pid_t child = fork();
   if (child > 0) {
-    waitpid(child, nullptr, 0);
+    while (waitpid(child, nullptr, 0) < 0 && errno == EINTR) {
+    }
   } else if (child == 0) {
     setsid();
     if (fork() != 0) _exit(0);
-    const int nowhere = open("/dev/null", O_RDWR);
+    const int nowhere = open("/dev/null", O_RDWR | O_CLOEXEC);
     for (int stream = 0; stream <= 2; ++stream) dup2(nowhere, stream);
     execlp("xdg-open", "xdg-open", address.c_str(), nullptr);
     _exit(127);
@@ -51,6 +53,7 @@ fs::path HelpPage(const std::string& commandLine) {
   const std::size_t anchor = target.find('#');
   const std::string page = target.substr(0, anchor);
   const fs::path folder = HelpFolder();
+  if (folder.empty()) return {};
   std::error_code error;
   if (anchor != std::string::npos) {
     fs::path topic =

@@ -85,7 +85,7 @@ ReadProfile ReadUnlocked(const fs::path& file) {
   return ReadLocked(file);
 }
 
-/// Keeps a copy of a file in which something other than a section stands where one must be written.
+/// Keeps a copy of a file in which something stands that is not what must be written in its place.
 void KeepCopy(const fs::path& file) {
   const fs::path kept = NameForDamaged(file);
   std::error_code error;
@@ -146,7 +146,9 @@ bool CProfile::Write(const std::string& section, const std::string& entry,
       profile.values.erase(section);
     }
     profile.values.emplace<toml::table>(section);
-    profile.values[section].as_table()->insert_or_assign(entry, value);
+    toml::table& values = *profile.values[section].as_table();
+    if (values.contains(entry) && !values[entry].template is<Value>()) KeepCopy(m_file);
+    values.insert_or_assign(entry, value);
     written = ReplaceFile(m_file, Format(profile.values));
   }
   if (!written) std::cerr << "The setting " << entry << " cannot be kept in " << m_file << ".\n";

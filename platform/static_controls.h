@@ -11,6 +11,7 @@ class CStatic : public CControl {
 
   const char* KindName() const override { return "static"; }
   void SetText(const std::string& text) override;
+  char Mnemonic() const override { return m_bPlainText ? '\0' : CControl::Mnemonic(); }
   /// A label may stand close to its control, so only its letters are drawn.
   bool OnEraseBkgnd(CSurface&) override { return true; }
   void OnPaint(CSurface& surface) override;

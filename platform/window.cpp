@@ -39,6 +39,7 @@ Point CWindow::ScreenOrigin() const {
 void CWindow::ShowWindow(bool visible) {
   if (m_bVisible == visible) return;
   m_bVisible = visible;
+  if (!visible) TheApp().Screen().TakePressFrom(*this);
   if (m_pParent != nullptr) m_pParent->Invalidate();
 }
 

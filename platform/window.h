@@ -34,6 +34,7 @@ class CWindow {
   Point ScreenOrigin() const;
 
   bool IsVisible() const { return m_bVisible; }
+  /// A press that a window has is lost when it is hidden.
   void ShowWindow(bool visible);
   /// A disabled window takes no input; neither do its children. A press that one of them has is
   /// lost.

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "platform/application.h"
@@ -36,9 +37,13 @@ class CFeltsideApp : public platform::CApplication {
   void OnNew();
   void OnAbout();
   void LoadHighScores();
-  void SaveHighScores() const;
+  void SaveHighScores();
+  std::vector<std::string> StoredHighScores() const;
+  void InsertHighScore(const std::string& name, int score);
 
   std::vector<std::string> m_arrHighScores;
+  std::vector<std::string> m_arrLoadedScores;  ///< as they were stored when the program started
+  std::vector<std::pair<std::string, int>> m_arrAdded;  ///< in this run
 };
 
 /// The one application object.

@@ -16,14 +16,24 @@ std::string EntryName(std::size_t place) { return "High" + std::to_string(place)
 
 }  // namespace
 
-void CFeltsideApp::LoadHighScores() {
+std::vector<std::string> CFeltsideApp::StoredHighScores() const {
+  std::vector<std::string> entries;
   for (std::size_t place = 0; place < kMostEntries; ++place) {
     const std::string entry = Profile().GetString(kSettingsSection, EntryName(place), "");
-    if (!entry.empty()) m_arrHighScores.push_back(entry);
+    if (!entry.empty()) entries.push_back(entry);
   }
+  return entries;
 }
 
-void CFeltsideApp::SaveHighScores() const {
+void CFeltsideApp::LoadHighScores() { m_arrHighScores = m_arrLoadedScores = StoredHighScores(); }
+
+void CFeltsideApp::SaveHighScores() {
+  // Another game has kept a result since this one started: that list is the one to go on with.
+  const auto stored = StoredHighScores();
+  if (!stored.empty() && stored != m_arrLoadedScores) {
+    m_arrHighScores = stored;
+    for (const auto& [name, score] : m_arrAdded) InsertHighScore(name, score);
+  }
   for (std::size_t place = 0; place < m_arrHighScores.size(); ++place) {
     Profile().WriteString(kSettingsSection, EntryName(place), m_arrHighScores[place]);
   }
@@ -38,6 +48,11 @@ int CFeltsideApp::ScoreOf(const std::string& entry) {
 }
 
 void CFeltsideApp::AddHighScore(const std::string& name, int score) {
+  m_arrAdded.emplace_back(name, score);
+  InsertHighScore(name, score);
+}
+
+void CFeltsideApp::InsertHighScore(const std::string& name, int score) {
   const auto lower =
       std::find_if(m_arrHighScores.begin(), m_arrHighScores.end(),
                    [score](const std::string& entry) { return ScoreOf(entry) < score; });

@@ -54,6 +54,7 @@ void CHighScoresDlg::OnOK() {
           platform::MessageBoxResult::kYes) {
     return CDialog::OnOK();
   }
+  // With a name it is entered; without one it only gets the keyboard back.
   OnAdd();
 }
 

@@ -178,6 +178,14 @@ TEST(HighScores, GapsAreClosedWhenTheListIsLoaded) {
   }
 }
 
+TEST(HighScores, WhatAnotherGameKeptMeanwhileStays) {
+  Stylus stylus(ProfileWith({"Old 150"}));
+  stylus.Send("wallet 300");
+  stylus.SetSettings("High0 = 'Ann 900'\nHigh1 = 'Old 150'");
+  Follow(stylus, {{kExit, kEntryOpen}, {"type Bob"}, {"press 1"}, {"press 1", kLeft}});
+  EXPECT_THAT(KeptIn(stylus), ElementsAre("Ann 900", "Bob 300", "Old 150", "", ""));
+}
+
 TEST(HighScores, AnEmptyNameIsAskedAbout) {
   Stylus stylus;
   Follow(stylus, {{"wallet 150"},
