@@ -16,7 +16,7 @@ RANKS = (("ace", "A"), ("two", "2"), ("three", "3"), ("four", "4"), ("five", "5"
          ("seven", "7"), ("eight", "8"), ("nine", "9"), ("ten", "10"), ("jack", "J"),
          ("queen", "Q"), ("king", "K"))
 
-BLACK_SUIT = {"#": "black", "+": "grey_80"}
+BLACK_SUIT = {"#": "black"}
 RED_SUIT = {"#": "card_red"}
 SUIT_COLOURS = {"clubs": BLACK_SUIT, "diamonds": RED_SUIT, "hearts": RED_SUIT,
                 "spades": BLACK_SUIT}

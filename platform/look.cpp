@@ -81,7 +81,13 @@ char MnemonicOf(const std::string& text) {
 
 CBitmap Greyed(const CBitmap& picture) {
   CBitmap greyed = CBitmap::SeeThrough(picture.GetSize());
-  CSurface(greyed).DrawStencil({}, picture, kDisabledSign);
+  for (int y = 0; y < picture.GetSize().height; ++y) {
+    for (int x = 0; x < picture.GetSize().width; ++x) {
+      const Pixel pixel = picture.At({x, y});
+      const bool dark = IsOpaque(pixel) && ToColor(pixel) != kWhite;
+      if (dark) greyed.At({x, y}) = ToPixel(kDisabledSign);
+    }
+  }
   return greyed;
 }
 

@@ -32,7 +32,7 @@ std::string WithoutMnemonic(const std::string& text);
 /// The letter after the single '&' as a capital, or 0.
 char MnemonicOf(const std::string& text);
 
-/// A picture with every opaque pixel in the grey of what is disabled.
+/// A picture in the grey of what is disabled, without its white.
 CBitmap Greyed(const CBitmap& picture);
 
 }  // namespace platform
