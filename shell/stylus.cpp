@@ -40,6 +40,11 @@ int ToInt(const std::string& word) {
   return value;
 }
 
+/// The two words behind a command's name.
+platform::Point ToPoint(const std::vector<std::string>& words) {
+  return {ToInt(words[1]), ToInt(words[2])};
+}
+
 double ToMoney(const std::string& word) {
   char* end = nullptr;
   const double value = std::strtod(word.c_str(), &end);
@@ -100,12 +105,22 @@ nlohmann::ordered_json ToJson(const platform::CControl& control) {
           {"rect", {place.left, place.top, place.right, place.bottom}}};
 }
 
+/// The number of the control that has the keyboard; 0 for none.
+int FocusOf(const platform::CDialog& dialog) {
+  const auto* control = static_cast<const platform::CControl*>(dialog.GetFocus());
+  return control == nullptr ? 0 : control->GetID();
+}
+
 }  // namespace
 
 const std::vector<CStylus::Command>& CStylus::Commands() {
   static const std::vector<Command> commands = {
       {"tap", 2, 2, &CStylus::Tap},
       {"touch", 2, 2, &CStylus::Touch},
+      {"down", 2, 2, &CStylus::PointerDown},
+      {"move", 2, 2, &CStylus::PointerMove},
+      {"up", 2, 2, &CStylus::PointerUp},
+      {"wheel", 3, 3, &CStylus::Wheel},
       {"command", 1, 1, &CStylus::ChooseCommand},
       {"key", 1, 1, &CStylus::PressKey},
       {"type", 0, kAnyNumber, &CStylus::Type},
@@ -194,7 +209,9 @@ CStylus::Json CStylus::State() {
   state["controls"] = Json::array();
   if (const platform::CDialog* dialog = TopDialog()) {
     for (const auto& control : dialog->Controls()) state["controls"].push_back(ToJson(*control));
+    state["focus"] = FocusOf(*dialog);
   }
+  state["typing"] = m_host.WantsText();
   state["helps"] = m_host.HelpCalls();
   state["running"] = true;
   return state;
@@ -208,23 +225,46 @@ CStylus::Json CStylus::EnabledCommands() const {
   return enabled;
 }
 
-void CStylus::PutTap(platform::Point at) {
+void CStylus::PutPointer(platform::InputKind kind, platform::Point at) {
   platform::InputEvent event;
+  event.kind = kind;
   event.at = at;
-  event.kind = platform::InputKind::kPointerDown;
-  m_host.PutInput(event);
-  event.kind = platform::InputKind::kPointerUp;
   m_host.PutInput(event);
 }
 
+void CStylus::PutTap(platform::Point at) {
+  PutPointer(platform::InputKind::kPointerDown, at);
+  PutPointer(platform::InputKind::kPointerUp, at);
+}
+
 void CStylus::Tap(const Words& words) {
-  const platform::Point p{ToInt(words[1]), ToInt(words[2])};
+  const platform::Point p = ToPoint(words);
   if (View().GetClientRect().Contains(p)) PutTap(p + View().ScreenOrigin());
 }
 
 void CStylus::Touch(const Words& words) {
-  const platform::Point p{ToInt(words[1]), ToInt(words[2])};
+  const platform::Point p = ToPoint(words);
   if (RectAt({}, platform::CScreen::kSize).Contains(p)) PutTap(p);
+}
+
+void CStylus::PointerDown(const Words& words) {
+  PutPointer(platform::InputKind::kPointerDown, ToPoint(words));
+}
+
+void CStylus::PointerMove(const Words& words) {
+  PutPointer(platform::InputKind::kPointerMove, ToPoint(words));
+}
+
+void CStylus::PointerUp(const Words& words) {
+  PutPointer(platform::InputKind::kPointerUp, ToPoint(words));
+}
+
+void CStylus::Wheel(const Words& words) {
+  platform::InputEvent event;
+  event.kind = platform::InputKind::kWheel;
+  event.at = ToPoint(words);
+  event.wheel = ToInt(words[3]);
+  m_host.PutInput(event);
 }
 
 void CStylus::ChooseCommand(const Words& words) {

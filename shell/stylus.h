@@ -41,6 +41,10 @@ class CStylus {
 
   void Tap(const Words& words);
   void Touch(const Words& words);
+  void PointerDown(const Words& words);
+  void PointerMove(const Words& words);
+  void PointerUp(const Words& words);
+  void Wheel(const Words& words);
   void ChooseCommand(const Words& words);
   void PressKey(const Words& words);
   void Type(const Words& words);
@@ -53,6 +57,7 @@ class CStylus {
   void Press(const Words& words);
   void Select(const Words& words);
   void Slide(const Words& words);
+  void PutPointer(platform::InputKind kind, platform::Point at);
   void PutTap(platform::Point at);
   /// A control of the topmost dialog that can be worked with; throws where there is none of that
   /// number.

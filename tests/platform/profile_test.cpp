@@ -41,28 +41,11 @@ TEST_F(ProfileTest, BringsIntegersBack) {
 
 /// Any letters, many of them such as have a meaning in the file.
 std::string AwkwardText(std::mt19937& random) {
-  static const std::array<const char*, 22> kPieces = {"\"",
-                                                      "\"\"\"",
-                                                      "'",
-                                                      "'''",
-                                                      "\\",
-                                                      "\\n",
-                                                      "\n",
-                                                      "\r\n",
-                                                      "\t",
-                                                      " ",
-                                                      "#",
-                                                      "=",
-                                                      "[",
-                                                      "]",
-                                                      "\b",
-                                                      "\x01",
-                                                      "\x7F",
-                                                      "\xC3\xA4",
-                                                      "\xE2\x99\xA0",
-                                                      "\xF0\x9F\x82\xA1",
-                                                      "A",
-                                                      "1979-05-27"};
+  // clang-format off
+  static constexpr std::array kPieces = {
+      "\"", "\"\"\"", "'", "'''", "\\", "\\n", "\n", "\r\n", "\t", " ", "#", "=", "[", "]", "\b",
+      "\x01", "\x7F", "\xC3\xA4", "\xE2\x99\xA0", "\xF0\x9F\x82\xA1", "A", "1979-05-27"};
+  // clang-format on
   std::string text;
   for (auto left = random() % 12; left > 0; --left) text += kPieces[random() % kPieces.size()];
   if (random() % 8 == 0) text.push_back('\0');
@@ -198,7 +181,7 @@ TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
   m_profile.WriteInt("S", "other", 5);
   m_profile.WriteString("S", "text", a);
   std::mt19937 random(11);
-  for (int i = 0; i < 50; ++i) {
+  for (int i = 0; i < 200; ++i) {
     std::array<int, 2> beat{};
     ASSERT_EQ(pipe(beat.data()), 0);
     const pid_t child = InChild([&] {

@@ -1,8 +1,10 @@
-// Long random play: nothing a person may do at the table breaks it, and the money is always right.
+// Long random play, at the table and in the dialogs: nothing a person may do breaks it, the money
+// is always right, and every dialog can be left.
 
 #include <gtest/gtest.h>
 
 #include <array>
+#include <map>
 #include <memory>
 #include <random>
 
@@ -13,27 +15,32 @@ namespace feltside::tests {
 namespace {
 
 constexpr int kCommands = 50000;
+constexpr int kLeaveEvery = 200;  ///< commands until all dialogs are left
+constexpr int kMostEscapes = 6;
+
+using Texts = std::vector<std::string>;
 
 /// A person without a plan, the same one for the same seed.
 class Player {
  public:
   explicit Player(unsigned seed) : m_random(seed) {}
 
-  std::string NextCommand(const Json& state);
+  std::string NextCommand(const Json& state) {
+    return state["windows"].size() == 1 ? AtTheTable(state) : AtADialog(state["controls"]);
+  }
   std::string RandomSettings();
 
  private:
   int Number(int from, int to) {
     return from + static_cast<int>(m_random() % unsigned(to - from + 1));
   }
-  template <std::size_t count>
-  std::string OneOf(const std::array<const char*, count>& texts) {
-    return texts[m_random() % count];
-  }
+  const std::string& OneOf(const Texts& texts) { return texts[m_random() % texts.size()]; }
   std::string Place(int width, int height) {
     return std::to_string(Number(-2, width + 2)) + " " + std::to_string(Number(-2, height + 2));
   }
   std::string Stack(bool poker);
+  std::string AtTheTable(const Json& state);
+  std::string AtADialog(const Json& controls);
 
   std::mt19937 m_random;
 };
@@ -62,20 +69,20 @@ int CardsLeft(const Json& state) {
   return shoe["count"].get<int>() - shoe["position"].get<int>();
 }
 
-std::string Player::NextCommand(const Json& state) {
-  static constexpr std::array kMoves = {"command 32771", "command 32772", "command 32773",
-                                        "command 32775", "command 32776", "command 32776"};
-  static constexpr std::array kTargets = {
-      "tap 90 160",  "tap 110 160", "tap 100 160", "tap 110 165", "tap 60 195",
-      "tap 190 195", "tap 180 118", "tap 100 200", "tap 120 185", "tap 54 130",
-      "tap 87 130",  "tap 120 130", "tap 153 130", "tap 186 130"};
-  static constexpr std::array kKeys = {
-      "key H",     "key S",      "key D",     "key P",     "key I",     "key N",
-      "key B",     "key +",      "key -",     "key 1",     "key 2",     "key 3",
-      "key 4",     "key 5",      "key Enter", "key Space", "key Tab",   "key F10",
-      "key Alt+B", "key Escape", "key Down",  "key Up",    "key Alt+H", "key F4"};
-  static constexpr std::array kMalformed = {"hit",         "tap",     "tap x y",   "stack 99",
-                                            "wallet much", "key Hit", "clock now", "press 1 2"};
+std::string Player::AtTheTable(const Json& state) {
+  static const Texts kMoves = {"command 32771", "command 32772", "command 32773",
+                               "command 32775", "command 32776", "command 32776"};
+  static const Texts kTargets = {"tap 90 160",  "tap 110 160", "tap 100 160", "tap 110 165",
+                                 "tap 60 195",  "tap 190 195", "tap 180 118", "tap 100 200",
+                                 "tap 120 185", "tap 54 130",  "tap 87 130",  "tap 120 130",
+                                 "tap 153 130", "tap 186 130"};
+  static const Texts kKeys = {"key H", "key S", "key D",   "key P",     "key I",     "key N",
+                              "key B", "key +", "key -",   "key 1",     "key 2",     "key 3",
+                              "key 4", "key 5", "key F10", "key Enter", "key Space", "key Alt+B"};
+  static const Texts kDialogs = {"command 32779", "command 32777", "command 32781", "command 57664",
+                                 "command 57665"};
+  static const Texts kMalformed = {"hit",         "tap",     "tap x y",   "stack 99",
+                                   "wallet much", "key Hit", "clock now", "press 1 2"};
   const bool poker = state["m_nGameType"] == 1;
   const bool shortOfCards = state["m_bHandInProgress"] == 0 && CardsLeft(state) < 10;
   if (shortOfCards && (poker || Number(0, 4) > 0)) {
@@ -83,31 +90,59 @@ std::string Player::NextCommand(const Json& state) {
   }
   const int choice = Number(0, 99);
   if (choice < 30) return OneOf(kMoves);
-  if (choice < 55) return OneOf(kTargets);
-  if (choice < 70) return OneOf(kKeys);
-  if (choice < 78) return "tap " + Place(240, 268);
-  if (choice < 84) return "touch " + Place(240, 40);
-  if (choice < 86) return "touch " + Place(240, 294);
-  if (choice < 93) return Stack(poker);
-  if (choice < 95) return OneOf(kMalformed);
-  if (choice < 96) return "clock 20" + std::to_string(Number(10, 99)) + "-02-28T23:59:58";
-  if (choice < 97) return "type H";
-  if (choice < 98) return "wallet " + std::to_string(Number(-400, 4000) / 2.0);
+  if (choice < 53) return OneOf(kTargets);
+  if (choice < 68) return OneOf(kKeys);
+  if (choice < 76) return "tap " + Place(240, 268);
+  if (choice < 82) return "touch " + Place(240, 40);
+  if (choice < 89) return Stack(poker);
+  if (choice < 94) return OneOf(kDialogs);
+  if (choice < 96) return OneOf(kMalformed);
+  if (choice < 97) return "clock 20" + std::to_string(Number(10, 99)) + "-02-28T23:59:58";
+  if (choice < 98) return "type H";
+  if (choice < 99) return "wallet " + std::to_string(Number(-400, 4000) / 2.0);
   return Number(0, 40) == 0 ? "close" : "state";
 }
 
+std::string Player::AtADialog(const Json& controls) {
+  static const Texts kKeys = {
+      "Tab", "Shift+Tab", "Up",         "Down",   "Left",      "Right",  "Home",
+      "End", "PageUp",    "PageDown",   "Space",  "Enter",     "Escape", "F1",
+      "F4",  "Delete",    "Shift+Home", "Ctrl+A", "Backspace", "Ctrl+C", "Ctrl+V",
+      "Y",   "S",         "B",          "G",      "Alt+Down",  "Ctrl+X", "Shift+Left"};
+  static const Texts kTyped = {"x",
+                               " y ",
+                               "\u00E9\u20AC",
+                               "\U0001F600",
+                               "\u05E9\u05DC",
+                               "\"\\=[]",
+                               "a name longer than the box"};
+  const int choice = Number(0, 99);
+  if (choice < 10) return "touch " + Place(240, 294);
+  if (choice < 35 || controls.empty()) return "key " + OneOf(kKeys);
+  if (choice < 43) return "type " + OneOf(kTyped);
+  const Json& control = controls[m_random() % controls.size()];
+  const std::string number = std::to_string(control["number"].get<int>());
+  const Json& rect = control["rect"];
+  if (choice < 52) return "select " + number + " " + std::to_string(Number(-1, 12));
+  if (choice < 61) return "slide " + number + " " + std::to_string(Number(-1, 256));
+  if (choice > 70) return "press " + number;
+  return "touch " + std::to_string(Number(rect[0], rect[2])) + " " +
+         std::to_string(Number(rect[1], rect[3]));
+}
+
 std::string Player::RandomSettings() {
-  std::string text;
+  std::string text = "[Settings]\n";
   for (const char* name : {"GAME_TYPE", "STRATTYPE", "NUMDECKS", "PLAYSPEED", "FANCYVP", "FANCYBJ",
                            "VIDEODISCARDS", "USEHIGH"}) {
     text +=
         name + (" = " + std::to_string(Number(0, 5) == 0 ? Number(-1, 6) : Number(0, 1))) + "\n";
   }
-  return text + "CARDBACK = " + std::to_string(Number(53, 66)) + "\n";
+  return text + "CARDBACK = " + std::to_string(Number(53, 66)) + "\nHigh0 = 'Ann 500'\n";
 }
 
 /// A table and the second opinion on it.
 struct Table {
+  explicit Table(const std::string& profile) : stylus(profile) {}
   Stylus stylus;
   Json state = stylus.Send("state");
   TableModel model{state};
@@ -131,23 +166,31 @@ class RandomPlay : public testing::TestWithParam<unsigned> {};
 
 TEST_P(RandomPlay, KeepsTheTableInOrder) {
   Player player(GetParam());
-  auto table = std::make_unique<Table>();
+  auto table = std::make_unique<Table>("");
   int settled = 0;
+  std::map<std::string, int> seen;  // how often each window was the topmost
   for (int i = 0; i < kCommands && !HasFailure(); ++i) {
-    const Json& windows = table->state["windows"];
     std::string command = player.NextCommand(table->state);
-    // Dialogs are left alone; the menu is played with.
-    if (windows.size() > 1 && windows.back() != "BlackJack") command = "key Escape";
-    const bool between = table->state["m_bHandInProgress"] == 0 && windows.size() == 1;
-    if (between && i % 200 == 0) {
-      table->stylus.SetSettings(player.RandomSettings());
+    if (i % kLeaveEvery == 0) {
+      for (int key = 0; key < kMostEscapes && table->state["windows"].size() > 1; ++key) {
+        PlayOn(*table, "key Escape");
+      }
+      EXPECT_TRUE(table->state["windows"].size() == 1 || !table->state["running"]);
+      WriteFile(table->stylus.ProfileFile(), player.RandomSettings());
       command = "key Ctrl+N";
     }
-    if (PlayOn(*table, command)) continue;
+    const bool runs = table->state["running"] && PlayOn(*table, command);
+    ++seen[table->state["windows"].empty() ? "" : table->state["windows"].back()];
+    if (runs) continue;
     settled += table->model.Settled();
-    table = std::make_unique<Table>();
+    const std::string profile = ReadFile(table->stylus.ProfileFile());
+    table = std::make_unique<Table>(profile);
   }
-  EXPECT_GT(settled + table->model.Settled(), kCommands / 25);
+  EXPECT_GT(settled + table->model.Settled(), kCommands / 50);
+  for (const char* title : {"Feltside", "BlackJack", "Setup", "Setup Table", "Edit RGB Color",
+                            "High Scores", "About Feltside"}) {
+    EXPECT_GT(seen[title], kCommands / 500) << title;
+  }
 }
 
 INSTANTIATE_TEST_SUITE_P(Seeds, RandomPlay, testing::Values(1U, 2U));

@@ -99,6 +99,15 @@ std::string WrongFlags(const Json& s) {
   check(s["m_handDealer"].size() <= 5, "gave the dealer a sixth card");
   check(s["m_handPoker"].size() == 5 || s["m_handPoker"].empty(), "has no five poker cards");
   check(!inProgress || poker || s["m_handDealer"].size() == 2, "dealt to the dealer too early");
+  const auto within = [](const Json& value, int least, int most) {
+    return value >= least && value <= most;
+  };
+  check(within(s["m_nGameType"], 0, 1) && within(s["m_nStrategyMode"], 0, 2) &&
+            within(s["m_nDeckChoice"], 0, 2) && within(s["m_nMaxDiscards"], 0, 5) &&
+            within(s["m_nDealerDelay"], 200, 2000) &&
+            within(s["m_layout"]["m_nCardBackID"], 54, 65) &&
+            within(s["m_layout"]["m_crTable"], 0, 0xFFFFFF),
+        "has a setting out of its range");
   return wrong;
 }
 

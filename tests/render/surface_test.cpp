@@ -4,6 +4,11 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
+#include "platform/resources.h"
+#include "tests/support/golden.h"
+
 namespace feltside::tests {
 namespace {
 
@@ -29,97 +34,43 @@ std::string Letters(const CBitmap& bitmap) {
   return text;
 }
 
-struct Call {
-  const char* letters;
-  void (*draw)(CSurface& surface);
-};
-
-CBitmap Source() {
+/// "wii iib ", with see-through pixels where `hidden` says so.
+CBitmap Source(const std::vector<Point>& hidden = {}) {
   CBitmap source({3, 2}, kInk);
   source.At({0, 0}) = ToPixel(kWhite);
   source.At({2, 1}) = ToPixel(kBlack);
+  for (const Point p : hidden) source.At(p) = 0;
   return source;
 }
 
 TEST(Surface, DrawsInsideItsBoundsOnly) {
-  for (const Call& call : std::vector<Call>{
-           {"..... .ii.. .ii.. ..... ",
-            [](CSurface& s) {
-              s.FillRect({1, 1, 3, 3}, kInk);
-            }},
-           {"iiiii iiiii iiiii iiiii ",
-            [](CSurface& s) {
-              s.FillRect({-9, -9, 99, 99}, kInk);
-            }},
-           {"..... ..... ..... ..... ",
-            [](CSurface& s) {
-              s.FillRect({3, 3, 3, 9}, kInk);
-            }},
-           {"..... ..... ..... ..... ",
-            [](CSurface& s) {
-              s.FillRect({4, 0, 2, 4}, kInk);
-            }},
-           {"bbbb. bwwb. bbbb. ..... ",
-            [](CSurface& s) {
-              s.Rectangle({0, 0, 4, 3});
-            }},
-           {"..... bbb.. ..... ..... ",
-            [](CSurface& s) {
-              s.Line({0, 1}, {3, 1});
-            }},
-           {"..b.. ..b.. ..b.. ..... ",
-            [](CSurface& s) {
-              s.Line({2, -5}, {2, 3});
-            }},
-           {"..... .wii. .iib. ..... ",
-            [](CSurface& s) {
-              s.BitBlt({1, 1}, {3, 2}, Source());
-            }},
-           {"..... .wi.. ..... ..... ",
-            [](CSurface& s) {
-              s.BitBlt({1, 1}, {2, 1}, Source());
-            }},
-           {"ib... ..... ..... ..... ",
-            [](CSurface& s) {
-              s.BitBlt({-1, -1}, {3, 2}, Source());
-            }},
-           {"....w ....i ..... ..... ",
-            [](CSurface& s) {
-              s.BitBlt({4, 0}, {9, 9}, Source());
-            }},
-           {"ib... ..... ..... ..... ",
-            [](CSurface& s) {
-              s.BitBlt({0, 0}, {2, 1}, Source(), {1, 1});
-            }},
-           {"wwii. wwii. iiib. iiib. ",  // what is wider than the source is left alone
-            [](CSurface& s) {
-              s.StretchBlt({0, 0, 2, 2}, Source(), {0, 0, 1, 1});
-              s.StretchBlt({2, 0, 4, 2}, Source(), {1, 0, 2, 1});
-              s.StretchBlt({0, 2, 3, 4}, Source(), {0, 1, 1, 2});
-              s.StretchBlt({3, 2, 4, 4}, Source(), {2, 1, 3, 2});
-            }},
-           {".wi.. ..b.. ..... ..... ",
-            [](CSurface& s) {
-              CBitmap icon = Source();
-              icon.At({2, 0}) = 0;
-              icon.At({0, 1}) = 0;
-              icon.At({1, 1}) = ToPixel(kBlack);
-              icon.At({2, 1}) = 0;
-              s.DrawIcon({1, 0}, icon);
-            }},
-           {".i... i.... ..... ..... ", [](CSurface& s) {
-              CBitmap stencil = CBitmap::SeeThrough({2, 2});
-              stencil.At({1, 0}) = stencil.At({0, 1}) = ToPixel(kBlack);
-              s.DrawStencil({0, 0}, stencil, kInk);
-            }}}) {
+  using Call = std::pair<const char*, std::function<void(CSurface&)>>;
+  // clang-format off
+  const std::vector<Call> calls = {
+      {"..... .ii.. .ii.. ..... ", [](CSurface& s) { s.FillRect({1, 1, 3, 3}, kInk); }},
+      {"iiiii iiiii iiiii iiiii ", [](CSurface& s) { s.FillRect({-9, -9, 99, 99}, kInk); }},
+      {"..... ..... ..... ..... ", [](CSurface& s) { s.FillRect({4, 0, 2, 4}, kInk); }},
+      {"bbbb. bwwb. bbbb. ..... ", [](CSurface& s) { s.Rectangle({0, 0, 4, 3}); }},
+      {"..... bbb.. ..... ..... ", [](CSurface& s) { s.Line({0, 1}, {3, 1}); }},
+      {"..b.. ..b.. ..b.. ..... ", [](CSurface& s) { s.Line({2, -5}, {2, 3}); }},
+      {"..... .wii. .iib. ..... ", [](CSurface& s) { s.BitBlt({1, 1}, {3, 2}, Source()); }},
+      {"..... .wi.. ..... ..... ", [](CSurface& s) { s.BitBlt({1, 1}, {2, 1}, Source()); }},
+      {"ib... ..... ..... ..... ", [](CSurface& s) { s.BitBlt({-1, -1}, {3, 2}, Source()); }},
+      {"....w ....i ..... ..... ", [](CSurface& s) { s.BitBlt({4, 0}, {9, 9}, Source()); }},
+      {"ib... ..... ..... ..... ", [](CSurface& s) { s.BitBlt({}, {2, 1}, Source(), {1, 1}); }},
+      {"wwi.. wwi.. iii.. iii.. ", [](CSurface& s) { s.StretchBlt({0, 0, 3, 4}, Source(), {0, 0, 2, 2}); }},
+      {".wi.. ..ib. ..... ..... ", [](CSurface& s) { s.DrawIcon({1, 0}, Source({{2, 0}, {0, 1}})); }},
+      {".ii.. i.i.. ..... ..... ", [](CSurface& s) { s.DrawStencil({}, Source({{0, 0}, {1, 1}}), kInk); }}};
+  // clang-format on
+  for (const auto& [letters, draw] : calls) {
     CBitmap whole({5, 4}, kGround);
     CSurface surface(whole);
-    call.draw(surface);
-    EXPECT_EQ(Letters(whole), call.letters);
+    draw(surface);
+    EXPECT_EQ(Letters(whole), letters);
     // The same on a part of a larger bitmap leaves everything around it alone.
     CBitmap larger({9, 9}, kGround);
     CSurface part(larger, {2, 3, 7, 7});
-    call.draw(part);
+    draw(part);
     CBitmap expected({9, 9}, kGround);
     CSurface(expected).BitBlt({2, 3}, {5, 4}, whole);
     EXPECT_EQ(Letters(larger), Letters(expected));
@@ -137,69 +88,41 @@ TEST(Surface, KeepsWhatIsCommonToPictureAndGround) {
   EXPECT_EQ(ToColor(bitmap.At({2, 0})), Rgb(0xC0, 0x0C, 0x0C));
 }
 
-/// The smallest rectangle around the pixels of a colour.
-Rect Around(const CBitmap& bitmap, Color color) {
-  Rect around{999, 999, 0, 0};
-  for (int y = 0; y < bitmap.GetSize().height; ++y) {
-    for (int x = 0; x < bitmap.GetSize().width; ++x) {
-      if (ToColor(bitmap.At({x, y})) != color) continue;
-      around = {std::min(around.left, x), std::min(around.top, y), std::max(around.right, x + 1),
-                std::max(around.bottom, y + 1)};
+TEST(Surface, ClipsTextToItsRectangleAndGivesItACell) {
+  CBitmap bitmap({60, 20}, kGround);
+  CSurface surface(bitmap);
+  surface.SetTextColor(kInk);
+  surface.DrawText({20, 5, 40, 12}, "HHHHHHHHHHHHHHHH", TextAlign::kRight);
+  for (int y = 0; y < 20; ++y) {
+    for (int x = 0; x < 60; ++x) {
+      const bool inside = Rect{20, 5, 40, 12}.Contains({x, y});
+      ASSERT_EQ(ToColor(bitmap.At({x, y})) == kGround, !inside) << x << ", " << y;
     }
   }
-  return around;
-}
-
-TEST(Surface, StandsTextOnACellInOpaqueModeOnly) {
-  CBitmap bitmap({80, 40}, kGround);
-  CSurface surface(bitmap);
-  surface.SetTextColor(kInk);
-  surface.SetBackColor(kWhite);
-  surface.SetFont({15, true});
-  surface.TextOut({10, 9}, "Deal");
-  const Size extent = surface.TextExtent("Deal");
-  EXPECT_EQ(Around(bitmap, kWhite), RectAt({10, 9}, extent));
-  const Rect ink = Around(bitmap, kInk);
-  EXPECT_EQ(ink.Common(RectAt({10, 9}, extent)), ink);
-  EXPECT_GT(ink.Width(), extent.width - 4);
-
-  surface.SetBackMode(BackMode::kTransparent);
-  surface.FillRect(surface.Bounds(), kGround);
-  surface.TextOut({10, 9}, "Deal");
-  EXPECT_EQ(Around(bitmap, kInk), ink);
-  EXPECT_EQ(Around(bitmap, kWhite), (Rect{999, 999, 0, 0}));
-}
-
-TEST(Surface, AlignsTextAndClipsItToItsRectangle) {
-  CBitmap bitmap({120, 30}, kGround);
-  CSurface surface(bitmap);
-  surface.SetTextColor(kInk);
-  const int width = surface.TextExtent("HH").width;
-  const Rect place{20, 5, 100, 19};
-  const auto left = [&](TextAlign align) {
-    surface.FillRect(surface.Bounds(), kGround);
-    surface.DrawText(place, "HH", align);
-    return Around(bitmap, kWhite).left;
-  };
-  EXPECT_EQ(left(TextAlign::kLeft), 20);
-  EXPECT_EQ(left(TextAlign::kRight), 100 - width);
-  EXPECT_EQ(left(TextAlign::kCenter), 20 + (80 - width) / 2);
-  surface.FillRect(surface.Bounds(), kGround);
-  surface.DrawText({20, 5, 50, 12}, "HHHHHHHHHHHHHHHH", TextAlign::kRight);
-  EXPECT_EQ(Around(bitmap, kWhite).Common({20, 5, 50, 12}), Around(bitmap, kWhite));
 }
 
 TEST(Text, HasExactCellHeights) {
   for (const int height : {11, 13, 14, 15, 22}) {
     for (const bool bold : {false, true}) {
       const Font font{height, bold};
-      EXPECT_EQ(MeasureText(font, "Player").height, height);
       EXPECT_EQ(MeasureText(font, ""), (Size{0, height}));
       EXPECT_EQ(RenderText(font, "Player").GetSize(), MeasureText(font, "Player"));
       EXPECT_GE(MeasureText({height, true}, "Player").width, MeasureText(font, "Player").width);
     }
     EXPECT_NE(RenderText({height, true}, "Player"), RenderText({height, false}, "Player"));
   }
+}
+
+TEST(Resources, ShowABlankWithItsNumberForAPictureThatIsMissing) {
+  CResources none({nullptr, 0});
+  CBitmap expected({29, 41});
+  CSurface surface(expected);
+  surface.Rectangle(surface.Bounds());
+  const int width = MeasureText({11, false}, "77").width;
+  surface.DrawStencil({(29 - width) / 2, 15}, RenderText({11, false}, "77"), kBlack);
+  ExpectSame(none.LoadBitmap(77, {29, 41}), expected, "blank");
+  EXPECT_EQ(none.LoadIcon(136, {16, 16}).GetSize(), (Size{16, 16}));
+  EXPECT_FALSE(none.LoadIconOfSize(128, 16).has_value());
 }
 
 }  // namespace

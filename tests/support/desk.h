@@ -1,68 +1,62 @@
 #pragma once
 
 #include <functional>
-#include <memory>
-#include <utility>
+#include <string>
 
-#include "platform/application.h"
+#include "platform/dialog.h"
 #include "platform/offscreen_host.h"
-#include "tests/support/temporary_folder.h"
+#include "shell/feltside_app.h"
+#include "shell/table_state.h"
+#include "tests/support/stylus.h"
 
 namespace feltside::tests {
 
 /// A machine with a profile of its own; for as long as it lives it is the host of this process.
-class DeskHost : public platform::OffscreenHost {
+class DeskHost : private TemporaryFolder, public platform::OffscreenHost {
  public:
-  DeskHost() : DeskHost(std::make_unique<TemporaryFolder>()) {}
+  DeskHost() : OffscreenHost(Path()) { platform::SetHost(this); }
   ~DeskHost() override { platform::SetHost(&m_previous); }
 
   /// Called whenever the program waits for a time to pass.
   void SetPauseHandler(std::function<void()> onPause) { m_onPause = std::move(onPause); }
   void WaitEvent(int milliseconds) override;
-
   void PutPointer(platform::InputKind kind, platform::Point at);
   void PutKey(const std::string& chord);
 
  private:
-  explicit DeskHost(std::unique_ptr<TemporaryFolder> folder);
-
-  std::unique_ptr<TemporaryFolder> m_pFolder;
-  platform::Host& m_previous;
+  platform::Host& m_previous = platform::TheHost();
   std::function<void()> m_onPause;
 };
 
-/// A program that runs in this process, from one idle moment to the next, so that a test may put
-/// whatever it likes into its queue in between.
-template <class App>
+/// The game in this process, worked with messages and input from one idle moment to the next, with
+/// whatever dialogs are open by then. It runs in a thread of its own, as an open dialog does not
+/// return, but never at the same time as the test. It is closed when this object goes.
 class Desk {
  public:
-  explicit Desk(const std::string& profile = {}) {
-    if (!profile.empty()) {
-      WriteFile(m_host.ProfileFolder() / "Quillworks" / "Feltside.toml", profile);
-    }
-    // A window that waits for an answer, with nobody to give it, is closed.
-    m_host.SetIdleHandler([this] { return !std::exchange(m_bIdle, true); });
-    m_pApp = std::make_unique<Started>();
-  }
+  /// Starts the game with this text as its settings' file.
+  explicit Desk(const std::string& profile = {});
+  ~Desk();
+  Desk(const Desk&) = delete;
+  Desk& operator=(const Desk&) = delete;
 
   DeskHost& Host() { return m_host; }
-  App& Program() { return *m_pApp; }
+  CTableState Table() const;
+  /// The members of the table.
+  Json State() const { return Json::parse(Table().Read().dump()); }
+  /// The topmost window, which must be a dialog.
+  platform::CDialog* Dialog() const;
 
-  /// Lets the program handle all that waits; answers whether it still runs.
-  bool RunUntilIdle() {
-    m_bIdle = false;
-    m_pApp->RunUntil([this] { return m_bIdle; });
-    return m_bIdle;
-  }
+  /// Puts a message behind those that wait.
+  static void Post(const platform::Message& message);
+  /// Lets the game handle all that waits; answers whether it still runs.
+  bool Run();
+  /// Both for a command.
+  void Command(int commandID);
 
  private:
-  struct Started : App {
-    Started() { this->InitInstance(); }
-  };
-
   DeskHost m_host;
-  std::unique_ptr<Started> m_pApp;
-  bool m_bIdle = false;
+  bool m_bLeaving = false;
+  bool m_bRunning = true;
 };
 
 }  // namespace feltside::tests

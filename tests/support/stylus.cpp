@@ -64,14 +64,6 @@ Json Stylus::Send(const std::string& line) {
   return Json::parse(text);
 }
 
-Json Stylus::Tap(int x, int y) {
-  return Send("tap " + std::to_string(x) + " " + std::to_string(y));
-}
-
-void Stylus::SetSettings(const std::string& lines) {
-  WriteFile(ProfileFile(), "[Settings]\n" + lines + "\n");
-}
-
 platform::CBitmap Stylus::Shot() {
   const std::string file = m_folder.Path() / "shot.png";
   Send("shot " + file);

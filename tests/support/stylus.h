@@ -28,10 +28,7 @@ class Stylus {
 
   /// Gives a command and returns its answer; throws when the program has died.
   Json Send(const std::string& line);
-  Json Tap(int x, int y);
 
-  /// "[Settings]" with these lines in it.
-  void SetSettings(const std::string& lines);
   std::filesystem::path ProfileFile() const;
   /// The whole window.
   platform::CBitmap Shot();

@@ -1,4 +1,4 @@
-#include "tests/support/hands.h"
+#include "tests/support/table_line.h"
 
 #include <sstream>
 #include <vector>
@@ -39,18 +39,6 @@ std::string Moves(const Json& state) {
 }
 
 }  // namespace
-
-std::string StackOf(const std::string& cards) {
-  const std::string ranks = "A23456789TJQK";
-  const std::string suits = "CDHS";
-  std::string command = "stack";
-  std::istringstream words(cards);
-  for (std::string word; words >> word;) {
-    const std::size_t suit = word.size() > 1 ? suits.find(word[1]) : 0;
-    command += " " + std::to_string(suit * ranks.size() + ranks.find(word[0]) + 1);
-  }
-  return command;
-}
 
 std::string TableLine(const Json& state) {
   const auto text = [&state](const char* member) { return state[member].get<std::string>(); };

@@ -6,10 +6,6 @@
 
 namespace feltside::tests {
 
-/// The "stack" command for cards such as "AS KH T 2D": a rank (A, 2 .. 9, T, J, Q, K) and a suit
-/// (C, D, H, S) each. Cards without a suit are clubs.
-std::string StackOf(const std::string& cards);
-
 /// The blackjack table in a line of six fields: the wallet; the player's total and message; the
 /// same of the split hand; the dealer's total; the flags that are set (insured, doubled, second for
 /// playing the split hand, "doubled second" for that one doubled); and what may be done now.
