@@ -3,6 +3,7 @@
 #include <toml++/toml.h>
 
 #include <fstream>
+#include <functional>
 #include <iostream>
 #include <limits>
 #include <optional>
@@ -100,6 +101,35 @@ std::string Format(const toml::table& values) {
   return text.str();
 }
 
+/// Puts a value into a section; what was none of its type is kept in a copy of the file.
+template <class Value>
+void Put(const fs::path& file, toml::table& values, const std::string& entry, const Value& value) {
+  if (values.contains(entry) && !values[entry].template is<Value>()) KeepCopy(file);
+  values.insert_or_assign(entry, value);
+}
+
+/// Changes a section of the file in one step that no other game comes between; `entry` names on the
+/// error stream what could not be kept.
+bool Update(const fs::path& file, const std::string& section, const std::string& entry,
+            const std::function<void(toml::table&)>& change) {
+  std::error_code error;
+  fs::create_directories(file.parent_path(), error);
+  const CFileLock lock(LockOf(file));
+  ReadProfile profile = ReadLocked(file);
+  bool written = false;
+  if (profile.reading != Reading::kUnreadable) {
+    if (profile.values.contains(section) && !profile.values[section].is_table()) {
+      KeepCopy(file);
+      profile.values.erase(section);
+    }
+    profile.values.emplace<toml::table>(section);
+    change(*profile.values[section].as_table());
+    written = ReplaceFile(file, Format(profile.values));
+  }
+  if (!written) std::cerr << "The setting " << entry << " cannot be kept in " << file << ".\n";
+  return written;
+}
+
 }  // namespace
 
 CProfile::CProfile(fs::path file) : m_file(std::move(file)) {
@@ -124,35 +154,28 @@ std::string CProfile::GetString(const std::string& section, const std::string& e
 }
 
 bool CProfile::WriteInt(const std::string& section, const std::string& entry, int value) const {
-  return Write(section, entry, static_cast<std::int64_t>(value));
+  return Update(m_file, section, entry, [&](toml::table& values) {
+    Put(m_file, values, entry, static_cast<std::int64_t>(value));
+  });
 }
 
 bool CProfile::WriteString(const std::string& section, const std::string& entry,
                            const std::string& value) const {
-  return Write(section, entry, value);
+  return Update(m_file, section, entry,
+                [&](toml::table& values) { Put(m_file, values, entry, value); });
 }
 
-template <class Value>
-bool CProfile::Write(const std::string& section, const std::string& entry,
-                     const Value& value) const {
-  std::error_code error;
-  fs::create_directories(m_file.parent_path(), error);
-  const CFileLock lock(LockOf(m_file));
-  ReadProfile profile = ReadLocked(m_file);
-  bool written = false;
-  if (profile.reading != Reading::kUnreadable) {
-    if (profile.values.contains(section) && !profile.values[section].is_table()) {
-      KeepCopy(m_file);
-      profile.values.erase(section);
+bool CProfile::UpdateStrings(const std::string& section, const std::vector<std::string>& entries,
+                             const StringsRule& rule) const {
+  return Update(m_file, section, entries.front(), [&](toml::table& values) {
+    std::vector<std::string> strings;
+    strings.reserve(entries.size());
+    for (const std::string& entry : entries) {
+      strings.push_back(values[entry].value_exact<std::string>().value_or(""));
     }
-    profile.values.emplace<toml::table>(section);
-    toml::table& values = *profile.values[section].as_table();
-    if (values.contains(entry) && !values[entry].template is<Value>()) KeepCopy(m_file);
-    values.insert_or_assign(entry, value);
-    written = ReplaceFile(m_file, Format(profile.values));
-  }
-  if (!written) std::cerr << "The setting " << entry << " cannot be kept in " << m_file << ".\n";
-  return written;
+    strings = rule(strings);
+    for (std::size_t i = 0; i < strings.size(); ++i) Put(m_file, values, entries[i], strings[i]);
+  });
 }
 
 }  // namespace platform

@@ -1,7 +1,9 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <string>
+#include <vector>
 
 namespace platform {
 
@@ -24,10 +26,15 @@ class CProfile {
   bool WriteString(const std::string& section, const std::string& entry,
                    const std::string& value) const;
 
- private:
-  template <class Value>
-  bool Write(const std::string& section, const std::string& entry, const Value& value) const;
+  /// Takes the strings of some entries, empty where there is none, and answers what to write from
+  /// the first entry on; at most as many.
+  using StringsRule = std::function<std::vector<std::string>(const std::vector<std::string>&)>;
+  /// Changes several strings in one step: all of them or, when the program dies, none; and no other
+  /// game comes between the reading and the writing. Answers whether they are on the disk.
+  bool UpdateStrings(const std::string& section, const std::vector<std::string>& entries,
+                     const StringsRule& rule) const;
 
+ private:
   std::filesystem::path m_file;
 };
 

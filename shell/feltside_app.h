@@ -38,7 +38,6 @@ class CFeltsideApp : public platform::CApplication {
   void OnAbout();
   void LoadHighScores();
   void SaveHighScores();
-  std::vector<std::string> StoredHighScores() const;
   void InsertHighScore(const std::string& name, int score);
 
   std::vector<std::string> m_arrHighScores;

@@ -10,33 +10,37 @@
 namespace feltside {
 namespace {
 
-constexpr std::size_t kMostEntries = 5;
+/// By place; as many as the list has.
+const std::vector<std::string> kEntryNames = {"High0", "High1", "High2", "High3", "High4"};
 
-std::string EntryName(std::size_t place) { return "High" + std::to_string(place); }
+/// What a list holds besides empty strings, which are no entries.
+std::vector<std::string> EntriesOf(std::vector<std::string> strings) {
+  strings.erase(std::remove(strings.begin(), strings.end(), ""), strings.end());
+  return strings;
+}
 
 }  // namespace
 
-std::vector<std::string> CFeltsideApp::StoredHighScores() const {
-  std::vector<std::string> entries;
-  for (std::size_t place = 0; place < kMostEntries; ++place) {
-    const std::string entry = Profile().GetString(kSettingsSection, EntryName(place), "");
-    if (!entry.empty()) entries.push_back(entry);
+void CFeltsideApp::LoadHighScores() {
+  std::vector<std::string> strings;
+  strings.reserve(kEntryNames.size());
+  for (const std::string& name : kEntryNames) {
+    strings.push_back(Profile().GetString(kSettingsSection, name, ""));
   }
-  return entries;
+  m_arrHighScores = m_arrLoadedScores = EntriesOf(strings);
 }
 
-void CFeltsideApp::LoadHighScores() { m_arrHighScores = m_arrLoadedScores = StoredHighScores(); }
-
 void CFeltsideApp::SaveHighScores() {
-  // Another game has kept a result since this one started: that list is the one to go on with.
-  const auto stored = StoredHighScores();
-  if (!stored.empty() && stored != m_arrLoadedScores) {
-    m_arrHighScores = stored;
-    for (const auto& [name, score] : m_arrAdded) InsertHighScore(name, score);
-  }
-  for (std::size_t place = 0; place < m_arrHighScores.size(); ++place) {
-    Profile().WriteString(kSettingsSection, EntryName(place), m_arrHighScores[place]);
-  }
+  if (m_arrHighScores.empty()) return;
+  Profile().UpdateStrings(kSettingsSection, kEntryNames, [this](const auto& strings) {
+    // Another game has kept a result since this one started: that list is the one to go on with.
+    const auto stored = EntriesOf(strings);
+    if (!stored.empty() && stored != m_arrLoadedScores) {
+      m_arrHighScores = stored;
+      for (const auto& [name, score] : m_arrAdded) InsertHighScore(name, score);
+    }
+    return m_arrHighScores;
+  });
 }
 
 int CFeltsideApp::ScoreOf(const std::string& entry) {
@@ -57,11 +61,11 @@ void CFeltsideApp::InsertHighScore(const std::string& name, int score) {
       std::find_if(m_arrHighScores.begin(), m_arrHighScores.end(),
                    [score](const std::string& entry) { return ScoreOf(entry) < score; });
   m_arrHighScores.insert(lower, name + " " + std::to_string(score));
-  if (m_arrHighScores.size() > kMostEntries) m_arrHighScores.pop_back();
+  if (m_arrHighScores.size() > kEntryNames.size()) m_arrHighScores.pop_back();
 }
 
 bool CFeltsideApp::IsHighScore(int score) const {
-  return m_arrHighScores.size() < kMostEntries || score > ScoreOf(m_arrHighScores.back());
+  return m_arrHighScores.size() < kEntryNames.size() || score > ScoreOf(m_arrHighScores.back());
 }
 
 }  // namespace feltside

@@ -178,8 +178,13 @@ TEST_F(ProfileTest, LosesNothingWhenTwoProgramsWriteAtOnce) {
 TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
   const std::string a(20000, 'a');
   const std::string b(20000, 'b');
+  const auto write = [this](const std::string& text) {
+    return m_profile.UpdateStrings("S", {"text", "twin"}, [&text](const auto&) {
+      return std::vector{text, text};
+    });
+  };
   m_profile.WriteInt("S", "other", 5);
-  m_profile.WriteString("S", "text", a);
+  write(a);
   std::mt19937 random(11);
   for (int i = 0; i < 200; ++i) {
     std::array<int, 2> beat{};
@@ -187,8 +192,8 @@ TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
     const pid_t child = InChild([&] {
       for (;;) {
         for (const std::string& text : {b, a}) {
-          if (write(beat[1], "x", 1) != 1) return;
-          m_profile.WriteString("S", "text", text);
+          if (::write(beat[1], "x", 1) != 1) return;
+          write(text);
         }
       }
     });
@@ -204,8 +209,9 @@ TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
     close(beat[1]);
     const std::string text = m_profile.GetString("S", "text", "absent");
     ASSERT_TRUE(text == a || text == b) << text.size();
+    ASSERT_EQ(m_profile.GetString("S", "twin", ""), text);
     ASSERT_EQ(m_profile.GetInt("S", "other", 0), 5);
-    ASSERT_TRUE(m_profile.WriteString("S", "text", a));  // nobody holds the lock
+    ASSERT_TRUE(write(a));  // nobody holds the lock
   }
   EXPECT_TRUE(KeptCopies(m_file).empty());
 }
