@@ -1,27 +1,16 @@
 #include "shell/stylus.h"
 
-#include <algorithm>
 #include <array>
-#include <charconv>
-#include <cmath>
-#include <cstdio>
-#include <cstdlib>
 #include <sstream>
-#include <utility>
 
 #include "platform/combo_box.h"
 #include "platform/slider.h"
+#include "shell/stylus_words.h"
 #include "shell/table_state.h"
 #include "table/command_ids.h"
 
 namespace feltside {
 namespace {
-
-/// What is wrong with a command.
-struct CommandError {
-  explicit CommandError(std::string text) : what(std::move(text)) {}
-  std::string what;
-};
 
 constexpr std::size_t kAnyNumber = static_cast<std::size_t>(-1);
 
@@ -30,49 +19,6 @@ constexpr std::array kShownCommands = {
     kCommandSplit,      kCommandDeal,          kCommandGameSetup,
     kCommandTableSetup, kCommandHighScores,    platform::kCommandAbout,
     kCommandHelp,       platform::kCommandExit};
-
-int ToInt(const std::string& word) {
-  int value = 0;
-  const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
-  if (error != std::errc{} || end != word.data() + word.size()) {
-    throw CommandError("not a whole number: " + word);
-  }
-  return value;
-}
-
-/// The two words behind a command's name.
-platform::Point ToPoint(const std::vector<std::string>& words) {
-  return {ToInt(words[1]), ToInt(words[2])};
-}
-
-double ToMoney(const std::string& word) {
-  char* end = nullptr;
-  const double value = std::strtod(word.c_str(), &end);
-  if (end == word.c_str() || *end != '\0' || !std::isfinite(value)) {
-    throw CommandError("no amount of money: " + word);
-  }
-  return value;
-}
-
-bool IsLeapYear(int year) { return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0; }
-
-/// Digits and signs just where "YYYY-MM-DDTHH:MM:SS" has them.
-bool HasDateShape(const std::string& text) {
-  const std::string shape = "0000-00-00T00:00:00";
-  const auto alike = [](char shown, char given) {
-    return shown == '0' ? given >= '0' && given <= '9' : shown == given;
-  };
-  return std::equal(shape.begin(), shape.end(), text.begin(), text.end(), alike);
-}
-
-bool IsDate(const platform::LocalTime& t) {
-  if (t.year < 1 || t.month < 1 || t.month > 12) return false;
-  constexpr std::array<int, 12> kDays = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
-  const int leapDay = t.month == 2 && IsLeapYear(t.year) ? 1 : 0;
-  return t.day >= 1 && t.day <= kDays[static_cast<std::size_t>(t.month - 1)] + leapDay &&
-         t.hour >= 0 && t.hour <= 23 && t.minute >= 0 && t.minute <= 59 && t.second >= 0 &&
-         t.second <= 59;
-}
 
 CFeltsideView& View() {
   return static_cast<CFeltsideView&>(platform::TheApp().MainFrame()->View());
@@ -186,13 +132,13 @@ void CStylus::Interpret(const std::string& line) {
       if (words.empty() || words[0] != command.name) continue;
       const std::size_t following = words.size() - 1;
       if (following < command.fewest || following > command.most) {
-        throw CommandError("wrong number of words: " + line);
+        throw CommandError{"wrong number of words: " + line};
       }
       // A text is taken as it stands, blanks and all.
       words[0] = line;
       return (this->*command.run)(words);
     }
-    throw CommandError("unknown command: " + line);
+    throw CommandError{"unknown command: " + line};
   } catch (const CommandError& error) {
     m_bWithState = false;
     m_answer["error"] = error.what;
@@ -279,7 +225,7 @@ void CStylus::ChooseCommand(const Words& words) {
 
 void CStylus::PressKey(const Words& words) {
   const auto stroke = platform::ParseChord(words[1]);
-  if (!stroke) throw CommandError("no such key: " + words[1]);
+  if (!stroke) throw CommandError{"no such key: " + words[1]};
   platform::InputEvent event;
   event.kind = platform::InputKind::kKey;
   event.stroke = *stroke;
@@ -289,7 +235,7 @@ void CStylus::PressKey(const Words& words) {
 void CStylus::Type(const Words& words) {
   // The text begins one blank behind the name and may consist of blanks.
   const std::size_t start = words[0].find("type") + std::string("type ").size();
-  if (words[0].size() <= start) throw CommandError("nothing to type");
+  if (words[0].size() <= start) throw CommandError{"nothing to type"};
   platform::InputEvent event;
   event.kind = platform::InputKind::kText;
   event.text = words[0].substr(start);
@@ -301,7 +247,7 @@ platform::CControl& CStylus::LiveControl(const std::string& word) {
   const platform::CDialog* dialog = TopDialog();
   platform::CControl* control = dialog == nullptr ? nullptr : dialog->GetDlgItem(controlID);
   if (control == nullptr || !control->IsVisible() || !control->IsEnabled()) {
-    throw CommandError("no such control: " + word);
+    throw CommandError{"no such control: " + word};
   }
   return *control;
 }
@@ -310,7 +256,7 @@ void CStylus::Press(const Words& words) {
   const platform::CControl& control = LiveControl(words[1]);
   const std::string kind = control.KindName();
   if (kind != "button" && kind != "check" && kind != "list") {
-    throw CommandError("not to be pressed: " + words[1]);
+    throw CommandError{"not to be pressed: " + words[1]};
   }
   DismissPopups();
   const platform::Rect place = control.GetClientRect();
@@ -320,8 +266,8 @@ void CStylus::Press(const Words& words) {
 void CStylus::Select(const Words& words) {
   const int item = ToInt(words[2]);
   auto* list = dynamic_cast<platform::CComboBox*>(&LiveControl(words[1]));
-  if (list == nullptr) throw CommandError("no list: " + words[1]);
-  if (item < 0 || item >= list->GetItemCount()) throw CommandError("no such item: " + words[2]);
+  if (list == nullptr) throw CommandError{"no list: " + words[1]};
+  if (item < 0 || item >= list->GetItemCount()) throw CommandError{"no such item: " + words[2]};
   DismissPopups();
   list->Choose(item);
 }
@@ -329,29 +275,20 @@ void CStylus::Select(const Words& words) {
 void CStylus::Slide(const Words& words) {
   const int value = ToInt(words[2]);
   auto* slider = dynamic_cast<platform::CSlider*>(&LiveControl(words[1]));
-  if (slider == nullptr) throw CommandError("no slider: " + words[1]);
+  if (slider == nullptr) throw CommandError{"no slider: " + words[1]};
   if (value < slider->GetLowest() || value > slider->GetHighest()) {
-    throw CommandError("beyond the slider's range: " + words[2]);
+    throw CommandError{"beyond the slider's range: " + words[2]};
   }
   slider->MoveTo(value);
 }
 
-void CStylus::SetClock(const Words& words) {
-  platform::LocalTime t{};
-  const std::string& text = words[1];
-  const int read = std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d", &t.year, &t.month, &t.day,
-                               &t.hour, &t.minute, &t.second);
-  if (!HasDateShape(text) || read != 6 || !IsDate(t)) {
-    throw CommandError("no date and time: " + text);
-  }
-  m_host.SetClock(t);
-}
+void CStylus::SetClock(const Words& words) { m_host.SetClock(ToTime(words[1])); }
 
 void CStylus::Stack(const Words& words) {
   std::vector<int> cards;
   for (std::size_t i = 1; i < words.size(); ++i) cards.push_back(ToInt(words[i]));
   const std::string wrong = CTableState(View()).Stack(cards);
-  if (!wrong.empty()) throw CommandError(wrong);
+  if (!wrong.empty()) throw CommandError{wrong};
 }
 
 void CStylus::SetWallet(const Words& words) {
@@ -362,7 +299,7 @@ void CStylus::SetWallet(const Words& words) {
 void CStylus::Shot(const Words& words) {
   m_bWithState = false;
   if (!platform::SavePng(m_host.Shown(), words[1])) {
-    throw CommandError("cannot write " + words[1]);
+    throw CommandError{"cannot write " + words[1]};
   }
 }
 
