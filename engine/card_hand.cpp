@@ -19,11 +19,6 @@ int CCardHand::AddCard(int card) {
   return 1;
 }
 
-bool CCardHand::Contains(int card) const {
-  const auto end = m_nCard.begin() + m_nCount;
-  return std::find(m_nCard.begin(), end, card) != end;
-}
-
 int CCardHand::RemoveCard(int card) {
   const auto end = m_nCard.begin() + m_nCount;
   const auto found = std::find(m_nCard.begin(), end, card);

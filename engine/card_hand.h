@@ -35,9 +35,6 @@ class CCardHand {
     return IsCard(card) ? kSuits - 1 - (card - 1) / kRanks : kNoSuit;
   }
 
-  /// Whether the hand holds this card.
-  bool Contains(int card) const;
-
   int GetCount() const { return m_nCount; }
 
   /// The card in this slot; kNoCard outside 0 .. count - 1.

@@ -46,6 +46,16 @@ int CShoe::TakeCard() {
   return m_nNext < m_nCount ? m_nCard[static_cast<std::size_t>(m_nNext++)] : kNoCard;
 }
 
+void CShoe::SetAside(const CCardHand& hand) {
+  for (int slot = 0; slot < hand.GetCount(); ++slot) {
+    const auto next = m_nCard.begin() + m_nNext;
+    const auto found = std::find(next, m_nCard.end(), hand.GetCard(slot));
+    if (found == m_nCard.end()) continue;
+    std::iter_swap(next, found);
+    ++m_nNext;
+  }
+}
+
 void CShoe::StackTop(const std::vector<int>& cards) {
   if (cards.size() > m_nCard.size()) {
     return;

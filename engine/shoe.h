@@ -2,7 +2,7 @@
 
 #include <vector>
 
-#include "engine/card.h"
+#include "engine/card_hand.h"
 #include "platform/runtime.h"
 
 namespace feltside {
@@ -26,6 +26,13 @@ class CShoe {
   /// never filled.
   int TakeCard();
 
+  /// After a shuffle in the midst of a deal: the cards of a hand, which lie on the table, are dealt
+  /// already and do not come again. A card that the shoe has no more of is passed over.
+  void SetAside(const CCardHand& hand);
+
+  /// Whether so few cards are left that a deal goes on with them rather than with a fresh shuffle.
+  bool IsNearEnd() const { return m_nCount - m_nNext <= kReserve; }
+
   /// For trying out hands: puts these cards into the last slots and deals them next. The shoe then
   /// stands at its end, so that a deal of at most so many cards does not shuffle it anew. More
   /// cards than the shoe has slots change nothing.
@@ -39,6 +46,8 @@ class CShoe {
   explicit CShoe(int decks);
 
  private:
+  static constexpr int kReserve = 15;
+
   void CheckCards() const;
 
   std::vector<int> m_nCard;  // m_nCount slots, kNoCard until the first fill

@@ -1,5 +1,7 @@
 #include "platform/command_bar.h"
 
+#include <algorithm>
+
 #include "platform/application.h"
 #include "platform/frame_window.h"
 #include "platform/look.h"
@@ -12,6 +14,13 @@ constexpr int kTitlePadding = 4;
 constexpr Size kButtonSize{24, 22};
 constexpr int kSeparatorWidth = 5;
 constexpr Size kCloseSize{18, 16};
+
+/// A part of a picture, see-through pixels included.
+CBitmap CutOut(const CBitmap& picture, const Rect& part) {
+  CBitmap cut = CBitmap::SeeThrough({part.Width(), part.Height()});
+  CSurface(cut).DrawIcon(Point{} - part.TopLeft(), picture);
+  return cut;
+}
 
 }  // namespace
 
@@ -30,15 +39,21 @@ void CCommandBar::AddAdornments() {
 }
 
 void CCommandBar::LoadToolBar(const ToolBarTemplate& toolBar) {
-  m_toolBar = toolBar;
+  const auto buttons =
+      toolBar.commandIDs.size() -
+      static_cast<std::size_t>(std::count(toolBar.commandIDs.begin(), toolBar.commandIDs.end(), 0));
+  const Size image = toolBar.imageSize;
+  const CBitmap& strip = TheApp().Resources().LoadBitmap(
+      toolBar.bitmapID, {image.width * static_cast<int>(buttons), image.height});
   int x = m_rcTitle.right + kSeparatorWidth;
   for (const int commandID : toolBar.commandIDs) {
     if (commandID == 0) {
       m_arrSeparators.push_back(x + kSeparatorWidth / 2);
       x += kSeparatorWidth;
     } else {
-      const int image = static_cast<int>(m_arrButtons.size());
-      m_arrButtons.push_back({commandID, image, RectAt({x, kTop}, kButtonSize), false});
+      const int number = static_cast<int>(m_arrButtons.size());
+      m_arrButtons.push_back({commandID, CutOut(strip, RectAt({number * image.width, 0}, image)),
+                              RectAt({x, kTop}, kButtonSize), false});
       x += kButtonSize.width;
     }
   }
@@ -92,33 +107,20 @@ void CCommandBar::DrawTools(CSurface& surface) const {
   for (const int x : m_arrSeparators) {
     surface.FillRect({x, kTop + 2, x + 1, kTop + kButtonSize.height - 2}, kShadowEdge);
   }
-  const Size size = m_toolBar.imageSize;
-  const Size strip{size.width * static_cast<int>(m_arrButtons.size()), size.height};
   for (const Button& button : m_arrButtons) {
     const bool pressed = PressedPlace() == button.place;
     DrawButtonFace(surface, button.place, pressed);
-    CBitmap image = CBitmap::SeeThrough(size);
-    const CBitmap& pictures = TheApp().Resources().LoadBitmap(m_toolBar.bitmapID, strip);
-    for (int y = 0; y < size.height; ++y) {
-      for (int x = 0; x < size.width; ++x) {
-        image.At({x, y}) = pictures.At({button.image * size.width + x, y});
-      }
-    }
+    const Size size = button.image.GetSize();
     const Point at{button.place.left + (button.place.Width() - size.width) / 2,
                    button.place.top + (button.place.Height() - size.height) / 2};
     const Point shift{pressed ? 1 : 0, pressed ? 1 : 0};
-    surface.DrawIcon(at + shift, button.enabled ? image : Greyed(image));
+    surface.DrawIcon(at + shift, button.enabled ? button.image : Greyed(button.image));
   }
 }
 
 void CCommandBar::DrawClose(CSurface& surface) const {
   DrawButtonFace(surface, m_rcClose, PressedPlace() == m_rcClose);
-  const Point middle{(m_rcClose.left + m_rcClose.right) / 2 - 1,
-                     (m_rcClose.top + m_rcClose.bottom) / 2 - 1};
-  for (int i = -3; i <= 3; ++i) {
-    surface.FillRect(RectAt(middle + Point{i, i}, {2, 1}), kBlack);
-    surface.FillRect(RectAt(middle + Point{i, -i}, {2, 1}), kBlack);
-  }
+  DrawCross(surface, m_rcClose);
 }
 
 /// The place that shows pressed; an empty one where nothing does.

@@ -39,7 +39,7 @@ class CCommandBar : public CWindow {
  private:
   struct Button {
     int commandID = 0;
-    int image = 0;
+    CBitmap image;
     Rect place;
     bool enabled = false;
   };
@@ -55,7 +55,6 @@ class CCommandBar : public CWindow {
   MenuTemplate m_menu;
   Rect m_rcTitle;
   Rect m_rcClose;
-  ToolBarTemplate m_toolBar{};
   std::vector<Button> m_arrButtons;
   std::vector<int> m_arrSeparators;  ///< x of each
   std::unique_ptr<CMenuWindow> m_pMenu;

@@ -25,7 +25,7 @@ void CControl::SetText(const std::string& text) {
 
 char CControl::Mnemonic() const { return MnemonicOf(m_strText); }
 
-bool CControl::HasFocus() { return m_dialog.GetFocus() == this; }
+bool CControl::HasFocus() { return m_dialog.IsEnabled() && m_dialog.GetFocus() == this; }
 
 void CControl::TakeFocus() { m_dialog.SetFocus(this); }
 

@@ -226,30 +226,47 @@ void CDialog::DrawCaption(CSurface& surface) const {
   surface.SetTextColor(kWhite);
   surface.TextOut({bar.left + 5, bar.top + 3}, GetTitle());
   const Rect close = CloseButton();
-  DrawButtonFace(surface, close, false);
-  for (int i = 0; i < 7; ++i) {
-    surface.FillRect(RectAt(close.TopLeft() + Point{4 + i, 3 + i}, {2, 1}), kBlack);
-    surface.FillRect(RectAt(close.TopLeft() + Point{10 - i, 3 + i}, {2, 1}), kBlack);
-  }
+  DrawButtonFace(surface, close, m_bInside && m_rcPressed == close);
+  DrawCross(surface, close);
   if (!HasHelp()) return;
-  DrawButtonFace(surface, HelpButton(), false);
+  DrawButtonFace(surface, HelpButton(), m_bInside && m_rcPressed == HelpButton());
   surface.SetTextColor(kBlack);
   surface.TextOut(HelpButton().TopLeft() + Point{4, 0}, "?");
 }
 
 void CDialog::OnLButtonDown(Point p) {
   m_grip = p;
-  m_bMoving = p.y < ClientPlace().top && !CloseButton().Contains(p) && !HelpButton().Contains(p);
+  m_rcPressed = CloseButton().Contains(p)  ? CloseButton()
+                : HelpButton().Contains(p) ? HelpButton()
+                                           : Rect{};
+  m_bInside = !m_rcPressed.IsEmpty();
+  m_bMoving = p.y < ClientPlace().top && !m_bInside;
+  Invalidate();
 }
 
 void CDialog::OnMouseMove(Point p) {
   if (m_bMoving) MoveBy(p - m_grip);
+  if (m_bInside == m_rcPressed.Contains(p)) return;
+  m_bInside = !m_bInside;
+  Invalidate();
+}
+
+void CDialog::OnPressLost() {
+  m_bMoving = false;
+  m_bInside = false;
+  m_rcPressed = {};
+  Invalidate();
 }
 
 void CDialog::OnLButtonUp(Point p) {
-  m_bMoving = false;
-  if (CloseButton().Contains(p) && CloseButton().Contains(m_grip)) OnCancel();
-  if (HelpButton().Contains(p) && HelpButton().Contains(m_grip)) OnHelp();
+  const Rect released = m_rcPressed.Contains(p) ? m_rcPressed : Rect{};
+  OnPressLost();
+  if (released.IsEmpty()) return;
+  if (released == CloseButton()) {
+    OnCancel();
+  } else {
+    OnHelp();
+  }
 }
 
 void CDialog::MoveBy(Point by) {

@@ -64,7 +64,7 @@ class CDialog : public CTopWindow {
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
   void OnLButtonUp(Point p) override;
-  void OnPressLost() override { m_bMoving = false; }
+  void OnPressLost() override;
   bool OnKeyDown(const KeyStroke& stroke) override;
 
  protected:
@@ -91,7 +91,9 @@ class CDialog : public CTopWindow {
   bool m_bEnded = false;
   int m_nResult = kResultCancel;
   bool m_bMoving = false;
-  Point m_grip;  ///< where the caption was taken
+  Point m_grip;            ///< where the caption was taken
+  Rect m_rcPressed;        ///< the caption's button that the stylus went down on; empty: none
+  bool m_bInside = false;  ///< still on it
 };
 
 }  // namespace platform

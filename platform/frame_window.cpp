@@ -19,25 +19,24 @@ void CFrameWindow::SetView(std::unique_ptr<CView> view) {
   SetFocus(m_pView.get());
 }
 
-CCommandTarget* CFrameWindow::TargetOf(int commandID, CommandState& state) {
+CCommandTarget* CFrameWindow::TargetOf(int commandID) {
+  if (!IsEnabled()) return nullptr;
   const std::array<CCommandTarget*, 3> targets = {m_pView.get(), this, &TheApp()};
   for (CCommandTarget* target : targets) {
-    state = target->QueryCommand(commandID);
-    if (state != CommandState::kUnknown) return target;
+    const CommandState state = target->QueryCommand(commandID);
+    if (state != CommandState::kUnknown) {
+      return state == CommandState::kEnabled ? target : nullptr;
+    }
   }
   return nullptr;
 }
 
-bool CFrameWindow::IsCommandEnabled(int commandID) {
-  CommandState state = CommandState::kUnknown;
-  return IsEnabled() && TargetOf(commandID, state) != nullptr && state == CommandState::kEnabled;
-}
+bool CFrameWindow::IsCommandEnabled(int commandID) { return TargetOf(commandID) != nullptr; }
 
 bool CFrameWindow::ExecuteCommand(int commandID) {
-  if (!IsCommandEnabled(commandID)) return false;
-  CommandState state = CommandState::kUnknown;
-  TargetOf(commandID, state)->RunCommand(commandID);
-  return true;
+  CCommandTarget* target = TargetOf(commandID);
+  if (target != nullptr) target->RunCommand(commandID);
+  return target != nullptr;
 }
 
 bool CFrameWindow::OnKeyDown(const KeyStroke& stroke) {

@@ -46,7 +46,8 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
   bool OnKeyDown(const KeyStroke& stroke) override;
 
  private:
-  CCommandTarget* TargetOf(int commandID, CommandState& state);
+  /// Who runs a command now; null where nobody may.
+  CCommandTarget* TargetOf(int commandID);
 
   std::vector<Accelerator> m_arrAccelerators;
   std::unique_ptr<CView> m_pView;

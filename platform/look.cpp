@@ -40,6 +40,14 @@ void DrawButtonFace(CSurface& surface, const Rect& rect, bool pressed) {
   surface.FillRect(rect.Shrunk(1), pressed ? kPressedColor : kFaceColor);
 }
 
+void DrawCross(CSurface& surface, const Rect& button) {
+  const Point middle{(button.left + button.right) / 2 - 1, (button.top + button.bottom) / 2 - 1};
+  for (int i = -3; i <= 3; ++i) {
+    surface.FillRect(RectAt(middle + Point{i, i}, {2, 1}), kBlack);
+    surface.FillRect(RectAt(middle + Point{i, -i}, {2, 1}), kBlack);
+  }
+}
+
 void DrawFocusRect(CSurface& surface, const Rect& rect) {
   const auto dot = [&surface](int x, int y) {
     if ((x + y) % 2 == 0) surface.FillRect({x, y, x + 1, y + 1}, kBlack);

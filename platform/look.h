@@ -19,6 +19,9 @@ inline constexpr Font kSystemFont{13, false};
 /// A button's face with its edges; pressed, the light comes from below.
 void DrawButtonFace(CSurface& surface, const Rect& rect, bool pressed);
 
+/// The cross that closes a window, seven pixels high, in the middle of a button.
+void DrawCross(CSurface& surface, const Rect& button);
+
 /// An outline of single dots that shows where the keyboard works.
 void DrawFocusRect(CSurface& surface, const Rect& rect);
 

@@ -1,5 +1,7 @@
 #include "platform/message_queue.h"
 
+#include <algorithm>
+
 #include "platform/host.h"
 
 namespace platform {
@@ -14,6 +16,16 @@ bool CMessageQueue::Peek(Message& message) {
   message = m_arrMessages.front();
   m_arrMessages.pop_front();
   return true;
+}
+
+void CMessageQueue::DropKeys() {
+  Collect();
+  const auto isKey = [](const Message& message) {
+    return message.kind == MessageKind::kInput &&
+           (message.input.kind == InputKind::kKey || message.input.kind == InputKind::kText);
+  };
+  m_arrMessages.erase(std::remove_if(m_arrMessages.begin(), m_arrMessages.end(), isKey),
+                      m_arrMessages.end());
 }
 
 void CMessageQueue::Wait() {

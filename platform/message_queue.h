@@ -30,6 +30,8 @@ class CMessageQueue {
   /// Takes the oldest waiting message, input that has come included. Does not wait; false: there
   /// is none.
   bool Peek(Message& message);
+  /// Forgets the keys and texts that wait.
+  void DropKeys();
   /// Waits until there may be a message.
   void Wait();
   /// Waits so many milliseconds and collects what comes meanwhile.

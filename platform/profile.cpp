@@ -18,6 +18,8 @@ namespace {
 
 namespace fs = std::filesystem;
 
+constexpr int kMostLinks = 20;  ///< more of them run in a circle
+
 /// How a reading of the file ended.
 enum class Reading { kRead, kMissing, kUnreadable, kDamaged };
 
@@ -33,7 +35,10 @@ ReadProfile Read(const fs::path& file) {
   std::ifstream stream(file, std::ios::binary);
   std::ostringstream text;
   text << stream.rdbuf();
-  if (!stream) return {fs::file_size(file, error) == 0 ? Reading::kRead : Reading::kUnreadable, {}};
+  // An empty file reads as a failure, too.
+  if (!stream || text.bad()) {
+    return {fs::file_size(file, error) == 0 ? Reading::kRead : Reading::kUnreadable, {}};
+  }
   try {
     return {Reading::kRead, toml::parse(text.str())};
   } catch (const toml::parse_error&) {
@@ -52,12 +57,12 @@ fs::path NameForDamaged(const fs::path& file) {
   return name;
 }
 
-void TellWhereKept(const fs::path& file, const fs::path& kept, const std::error_code& error) {
-  std::cerr << "The settings in " << file << " cannot be understood; ";
+void TellWhereKept(const std::string& what, const fs::path& kept, const std::error_code& error) {
+  std::cerr << what << " cannot be understood; ";
   if (error) {
-    std::cerr << "they cannot be kept as " << kept << " (" << error.message() << ").\n";
+    std::cerr << "the file cannot be kept as " << kept << " (" << error.message() << ").\n";
   } else {
-    std::cerr << "they are kept as " << kept << " and the defaults hold.\n";
+    std::cerr << "the file as it was is kept as " << kept << ".\n";
   }
 }
 
@@ -65,7 +70,7 @@ void SetAside(const fs::path& file) {
   const fs::path kept = NameForDamaged(file);
   std::error_code error;
   fs::rename(file, kept, error);
-  TellWhereKept(file, kept, error);
+  TellWhereKept("The settings in " + file.string(), kept, error);
 }
 
 fs::path LockOf(const fs::path& file) { return file.string() + ".lock"; }
@@ -86,12 +91,13 @@ ReadProfile ReadUnlocked(const fs::path& file) {
   return ReadLocked(file);
 }
 
-/// Keeps a copy of a file in which something stands that is not what must be written in its place.
-void KeepCopy(const fs::path& file) {
+/// Keeps a copy of a file in which something stands, under this name, that is not what must be
+/// written in its place.
+void KeepCopy(const fs::path& file, const std::string& name) {
   const fs::path kept = NameForDamaged(file);
   std::error_code error;
   fs::copy_file(file, kept, error);
-  TellWhereKept(file, kept, error);
+  TellWhereKept("The value of " + name + " in " + file.string(), kept, error);
 }
 
 /// Strings as plain quoted ones: in the other forms some line ends do not come back as they were.
@@ -104,7 +110,7 @@ std::string Format(const toml::table& values) {
 /// Puts a value into a section; what was none of its type is kept in a copy of the file.
 template <class Value>
 void Put(const fs::path& file, toml::table& values, const std::string& entry, const Value& value) {
-  if (values.contains(entry) && !values[entry].template is<Value>()) KeepCopy(file);
+  if (values.contains(entry) && !values[entry].template is<Value>()) KeepCopy(file, entry);
   values.insert_or_assign(entry, value);
 }
 
@@ -117,9 +123,9 @@ bool Update(const fs::path& file, const std::string& section, const std::string&
   const CFileLock lock(LockOf(file));
   ReadProfile profile = ReadLocked(file);
   bool written = false;
-  if (profile.reading != Reading::kUnreadable) {
+  if (profile.reading != Reading::kUnreadable && !lock.IsRefused()) {
     if (profile.values.contains(section) && !profile.values[section].is_table()) {
-      KeepCopy(file);
+      KeepCopy(file, section);
       profile.values.erase(section);
     }
     profile.values.emplace<toml::table>(section);
@@ -135,8 +141,9 @@ bool Update(const fs::path& file, const std::string& section, const std::string&
 CProfile::CProfile(fs::path file) : m_file(std::move(file)) {
   // What a symbolic link leads to is replaced, not the link.
   std::error_code error;
-  const fs::path target = fs::weakly_canonical(m_file, error);
-  if (!error) m_file = target;
+  for (int links = 0; links < kMostLinks && fs::is_symlink(m_file, error); ++links) {
+    m_file = m_file.parent_path() / fs::read_symlink(m_file, error);
+  }
 }
 
 int CProfile::GetInt(const std::string& section, const std::string& entry, int absent) const {
@@ -157,12 +164,6 @@ bool CProfile::WriteInt(const std::string& section, const std::string& entry, in
   return Update(m_file, section, entry, [&](toml::table& values) {
     Put(m_file, values, entry, static_cast<std::int64_t>(value));
   });
-}
-
-bool CProfile::WriteString(const std::string& section, const std::string& entry,
-                           const std::string& value) const {
-  return Update(m_file, section, entry,
-                [&](toml::table& values) { Put(m_file, values, entry, value); });
 }
 
 bool CProfile::UpdateStrings(const std::string& section, const std::vector<std::string>& entries,

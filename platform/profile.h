@@ -23,8 +23,6 @@ class CProfile {
                         const std::string& absent) const;
   /// Answers whether the value is on the disk.
   bool WriteInt(const std::string& section, const std::string& entry, int value) const;
-  bool WriteString(const std::string& section, const std::string& entry,
-                   const std::string& value) const;
 
   /// Takes the strings of some entries, empty where there is none, and answers what to write from
   /// the first entry on; at most as many.

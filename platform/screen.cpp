@@ -8,6 +8,7 @@
 namespace platform {
 
 void CScreen::Push(CTopWindow& window) {
+  LosePress();
   m_arrWindows.push_back(&window);
   MarkStale();
 }
@@ -26,6 +27,12 @@ CTopWindow* CScreen::WindowUnder(Point at) const {
   return found == m_arrWindows.rend() ? nullptr : *found;
 }
 
+void CScreen::LosePress() {
+  if (CWindow* pressed = std::exchange(m_pPressed, nullptr); pressed != nullptr) {
+    pressed->OnPressLost();
+  }
+}
+
 void CScreen::PressAt(Point at) {
   CTopWindow* window = WindowUnder(at);
   if (Top() != nullptr && Top() != window && Top()->GetKind() == CTopWindow::Kind::kPopup) {
@@ -33,6 +40,7 @@ void CScreen::PressAt(Point at) {
     return;
   }
   if (window == nullptr || !window->IsEnabled()) return;
+  LosePress();
   CWindow& pressed = window->WindowAt(at - window->GetPlace().TopLeft());
   m_pPressed = &pressed;
   pressed.OnLButtonDown(at - pressed.ScreenOrigin());
@@ -91,8 +99,7 @@ void CScreen::Present() {
 void CScreen::TakePressFrom(const CWindow& window) {
   for (const CWindow* at = m_pPressed; at != nullptr; at = at->GetParent()) {
     if (at != &window) continue;
-    std::exchange(m_pPressed, nullptr)->OnPressLost();
-    return;
+    return LosePress();
   }
 }
 

@@ -29,13 +29,15 @@ class CScreen {
   /// Shows the stack if it has changed since it was last shown.
   void Present();
 
-  /// A window is being disabled: a press that it or a child of it has is lost.
+  /// A window is being disabled or hidden: a press that it or a child of it has is lost.
   void TakePressFrom(const CWindow& window);
   /// The window is about to be destroyed.
   void Forget(CWindow& window);
 
  private:
   void PressAt(Point at);
+  /// Whoever has the pointer has it no more, without a release.
+  void LosePress();
   CTopWindow* WindowUnder(Point at) const;
 
   std::vector<CTopWindow*> m_arrWindows;

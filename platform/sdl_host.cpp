@@ -17,12 +17,21 @@
 namespace platform {
 namespace {
 
+/// Whether keys are chords now and type nothing; some desktops send a text for them all the same.
+/// The right Alt key types letters of its own.
+bool IsChordHeld() {
+  const SDL_Keymod held = SDL_GetModState();
+  return (held & (KMOD_RALT | KMOD_MODE)) == 0 && (held & (KMOD_CTRL | KMOD_LALT)) != 0;
+}
+
 /// SDL's subsystems for as long as the host lives.
 class SdlVideo {
  public:
   SdlVideo() {
     // A card game that lies idle is no reason to keep the screen on.
     SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
+    // Nor to take the desktop's effects away from all other windows.
+    SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
     m_bReady = SDL_Init(SDL_INIT_VIDEO) == 0;
   }
   ~SdlVideo() { SDL_Quit(); }
@@ -139,7 +148,7 @@ bool SdlHost::Translate(const SDL_Event& raw, InputEvent& event) {
     case SDL_TEXTINPUT:
       event.kind = InputKind::kText;
       event.text = raw.text.text;
-      return true;
+      return !IsChordHeld();
     default:
       return false;
   }

@@ -1,6 +1,7 @@
 #include "platform/sdl_keys.h"
 
 #include <cctype>
+#include <cstddef>
 
 namespace platform {
 namespace {
@@ -30,6 +31,23 @@ constexpr KeyPair kKeys[] = {
     {SDLK_F4, Key::kF4},
     {SDLK_F10, Key::kF10},
 };
+
+/// The keypad while it does not type digits.
+constexpr KeyPair kKeypad[] = {
+    {SDLK_KP_7, Key::kHome},        {SDLK_KP_8, Key::kUp},       {SDLK_KP_9, Key::kPageUp},
+    {SDLK_KP_4, Key::kLeft},        {SDLK_KP_6, Key::kRight},    {SDLK_KP_1, Key::kEnd},
+    {SDLK_KP_2, Key::kDown},        {SDLK_KP_3, Key::kPageDown}, {SDLK_KP_0, Key::kInsert},
+    {SDLK_KP_PERIOD, Key::kDelete},
+};
+
+/// The key that a code stands for in a table; kNone where it stands there for none.
+template <std::size_t count>
+Key KeyIn(const KeyPair (&keys)[count], SDL_Keycode code) {
+  for (const KeyPair& pair : keys) {
+    if (pair.code == code) return pair.key;
+  }
+  return Key::kNone;
+}
 
 /// What a key types that is no letter of its own on every keyboard: digits, whichever row or layer
 /// they lie on, and the signs of addition.
@@ -67,12 +85,9 @@ KeyStroke StrokeOf(const SDL_Keysym& key) {
   stroke.ctrl = (key.mod & KMOD_CTRL) != 0;
   stroke.alt = (key.mod & KMOD_ALT) != 0;
   stroke.shift = (key.mod & KMOD_SHIFT) != 0;
-  for (const KeyPair& pair : kKeys) {
-    if (pair.code == key.sym) {
-      stroke.key = pair.key;
-      return stroke;
-    }
-  }
+  stroke.key = KeyIn(kKeys, key.sym);
+  if (stroke.key == Key::kNone && (key.mod & KMOD_NUM) == 0) stroke.key = KeyIn(kKeypad, key.sym);
+  if (stroke.key != Key::kNone) return stroke;
   stroke.character = CharacterOf(key);
   if (stroke.character != 0) stroke.key = Key::kCharacter;
   return stroke;

@@ -58,14 +58,23 @@ char32_t CharacterAt(const std::string& text, std::size_t at) {
   return character;
 }
 
+namespace {
+
+/// The control characters of both ranges, and the separators of lines and paragraphs.
+bool IsControl(char32_t character) {
+  return character < 0x20 || (character >= 0x7F && character < 0xA0) || character == 0x2028 ||
+         character == 0x2029;
+}
+
+}  // namespace
+
 std::string OneLine(const std::string& text) {
   std::string line;
   for (std::size_t at = 0; at < text.size();) {
     const std::size_t length = LetterLength(text, at);
-    const bool control = length == 1 && (ByteAt(text, at) < 0x20 || ByteAt(text, at) == 0x7F);
     // A line break of two characters is one break.
     const bool secondOfBreak = text[at] == '\n' && at > 0 && text[at - 1] == '\r';
-    if (control) {
+    if (length > 0 && IsControl(CharacterAt(text, at))) {
       if (!secondOfBreak) line += ' ';
     } else {
       line += text.substr(at, length);

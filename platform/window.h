@@ -56,7 +56,8 @@ class CWindow {
   /// While the button or stylus that went down in this window is down; may lie outside of it.
   virtual void OnMouseMove(Point) {}
   virtual void OnLButtonUp(Point) {}
-  /// The press that this window had is over without a release: it was disabled meanwhile.
+  /// The press that this window had is over without a release: it was disabled or hidden meanwhile,
+  /// or another window opened.
   virtual void OnPressLost() {}
   virtual void OnMouseWheel(int) {}
   /// Answers whether the key meant something here; otherwise the parent is asked.

@@ -21,50 +21,67 @@ Point CTableLayout::Center() const {
 
 void CTableLayout::GetCardPos(int& x, int& y, int position, int slot) const {
   const Point center = Center();
-  const int gap = m_nCardWidth / 6;
-  const int rowWidth = m_nRowCards * m_nCardWidth + (m_nRowCards - 1) * gap;
-  const int fanLeft = ((m_nFanCards - 1) * m_nFanStepX + m_nCardWidth) / 2;
-  const int fanUp = ((m_nFanCards - 1) * m_nFanStepY + m_nCardHeight) / 2;
-  // Slot 1 stands on a fan's centred start, so that a hand of two reads as one in the middle.
-  const int alongX = (slot - 1) * m_nFanStepX - fanLeft;
-  const int alongY = (slot - 1) * m_nFanStepY - fanUp;
   const int bottom = m_rcTable.bottom - m_nCardHeight - kMargin;
   const int leftHalf = center.x - center.x / 2;
   const int rightHalf = center.x + center.x / 2;
-  const auto put = [&x, &y](int toX, int toY) {
-    x = toX;
-    y = toY;
-  };
+  Point at{x, y};
   switch (position) {
     case POS_MIDDLE_ROW:
-      return put(center.x - rowWidth / 2 + slot * (m_nCardWidth + gap),
-                 center.y - m_nCardHeight / 2);
+      at = {center.x - RowWidth() / 2 + slot * (m_nCardWidth + RowGap()),
+            center.y - m_nCardHeight / 2};
+      break;
     case POS_BOTTOM:
-      return put(center.x + alongX, bottom);
+      at = {center.x + AlongFan(slot), bottom};
+      break;
     case POS_TOP:
-      return put(center.x + alongX, kMargin);
+      at = {center.x + AlongFan(slot), kMargin};
+      break;
     case POS_LEFT:
-      return put(kMargin, center.y + alongY);
+      at = {kMargin, center.y + AlongSideFan(slot)};
+      break;
     case POS_RIGHT:
-      return put(m_rcTable.right - m_nCardWidth - kMargin, center.y + alongY);
+      at = {m_rcTable.right - m_nCardWidth - kMargin, center.y + AlongSideFan(slot)};
+      break;
     case POS_BOTTOM_LEFT:
-      return put(leftHalf + alongX, bottom);
+      at = {leftHalf + AlongFan(slot), bottom};
+      break;
     case POS_BOTTOM_RIGHT:
-      return put(rightHalf + alongX, bottom);
+      at = {rightHalf + AlongFan(slot), bottom};
+      break;
     case POS_TOP_LEFT:
-      return put(leftHalf + alongX, kMargin);
+      at = {leftHalf + AlongFan(slot), kMargin};
+      break;
     case POS_TOP_RIGHT:
-      return put(rightHalf + alongX, kMargin);
+      at = {rightHalf + AlongFan(slot), kMargin};
+      break;
     default:
-      return;
+      break;
   }
+  x = at.x;
+  y = at.y;
+}
+
+int CTableLayout::RowGap() const { return m_nCardWidth / 6; }
+
+int CTableLayout::RowWidth() const {
+  return m_nRowCards * m_nCardWidth + (m_nRowCards - 1) * RowGap();
+}
+
+// Slot 1 stands on a fan's centred start, so that a hand of two reads as one in the middle.
+
+int CTableLayout::AlongFan(int slot) const {
+  return (slot - 1) * m_nFanStepX - ((m_nFanCards - 1) * m_nFanStepX + m_nCardWidth) / 2;
+}
+
+int CTableLayout::AlongSideFan(int slot) const {
+  return (slot - 1) * m_nFanStepY - ((m_nFanCards - 1) * m_nFanStepY + m_nCardHeight) / 2;
 }
 
 Rect CTableLayout::GetPosRect(int position) const {
   if (position < POS_MIDDLE_ROW || position > POS_TOP_RIGHT) return {};
   platform::Size size{(m_nFanCards - 1) * m_nFanStepX + m_nCardWidth, m_nCardHeight};
   if (position == POS_MIDDLE_ROW) {
-    size.width = m_nRowCards * m_nCardWidth + (m_nRowCards - 1) * (m_nCardWidth / 6);
+    size.width = RowWidth();
   } else if (position == POS_LEFT || position == POS_RIGHT) {
     size = {m_nCardWidth, (m_nFanCards - 1) * m_nFanStepY + m_nCardHeight};
   }

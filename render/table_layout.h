@@ -93,6 +93,11 @@ class CTableLayout {
 
  private:
   platform::Point Center() const;
+  int RowGap() const;
+  int RowWidth() const;
+  /// How far from a fan's middle a slot's card begins.
+  int AlongFan(int slot) const;
+  int AlongSideFan(int slot) const;
   /// The corner of a position's slot.
   platform::Point CardCorner(int position, int slot) const;
   /// The height of the player box's title in its type; box and stake buttons are placed by it.

@@ -3,6 +3,7 @@
 #include <array>
 
 #include "engine/poker.h"
+#include "render/number_text.h"
 #include "render/table_layout.h"
 
 namespace feltside {
@@ -79,8 +80,7 @@ void CTableLayout::DrawPlayButton(bool deal) const {
 void CTableLayout::DrawAmount(int position, int dollars) const {
   const platform::Font previous = m_pDC->SetFont(kPayFont);
   const platform::Color previousColor = m_pDC->SetTextColor(kAmountColor);
-  std::string text = std::to_string(dollars);
-  text.insert(text.begin(), '$');
+  const std::string text = NumberText("$%d", dollars);
   const platform::Size extent = m_pDC->TextExtent(text);
   const Point at = CardCorner(position, 0);
   TextOnTable({at.x - extent.width - 10, at.y - 2 * extent.height - 3 + m_nCardHeight}, text);

@@ -75,8 +75,8 @@ void CFeltsideView::Hit() {
   hand.AddCard(NextCard());
   const int total = hand.GetTotal();
   const bool playingSplit = m_bPlayingSplit != 0;
-  (playingSplit ? m_strSplitScore : m_strPlayerScore) = TotalText(hand);
-  if (total > kTwentyOne) (playingSplit ? m_strSplitMsg : m_strPlayerMsg) = "Bust";
+  ActiveScore() = TotalText(hand);
+  if (total > kTwentyOne) ActiveMsg() = "Bust";
   if (total < kTwentyOne) {
     Repaint();
   } else if (!playingSplit && IsSplit()) {
@@ -107,8 +107,8 @@ void CFeltsideView::DoubleDown() {
   (playingSplit ? m_bDoubledSplit : m_bDoubledPlayer) = 1;
   hand.AddCard(NextCard());
   const bool bust = hand.GetTotal() > kTwentyOne;
-  (playingSplit ? m_strSplitScore : m_strPlayerScore) = TotalText(hand);
-  (playingSplit ? m_strSplitMsg : m_strPlayerMsg) = bust ? "Bust!" : TotalText(hand);
+  ActiveScore() = TotalText(hand);
+  ActiveMsg() = bust ? "Bust!" : TotalText(hand);
   if (!playingSplit && IsSplit()) {
     PlaySplitHand();
   } else if (!playingSplit && bust) {

@@ -39,6 +39,8 @@ void CFeltsideView::DealerPlay() {
     Repaint();
     if (m_handDealer.GetTotal() < kDealerStands) platform::Sleep(m_nDealerDelay);
   }
+  // A key struck in impatience would deal anew before the result could be read.
+  platform::TheApp().Queue().DropKeys();
   Settle();
 }
 

@@ -1,17 +1,9 @@
 #include "table/feltside_view.h"
 
-#include <algorithm>
 #include <cmath>
 #include <limits>
 
 namespace feltside {
-namespace {
-
-/// A shoe is shuffled anew before a deal unless so few cards remain.
-constexpr int kShoeReserve = 15;
-
-}  // namespace
-
 CFeltsideView::CFeltsideView(platform::CFrameWindow& frame)
     : CView(&frame, platform::CFrameWindow::ViewPlace()) {}
 
@@ -23,6 +15,18 @@ void CFeltsideView::OnInitialUpdate() {
   m_shoe6.Shuffle();
   m_handPoker.SetLimit(kPokerCards);
   m_layout.m_nRowCards = kPokerCards;
+  if (m_bHandInProgress != 0) SetHandsAside();
+}
+
+/// The document was renewed while a hand is played: its cards are not in the shuffled shoe.
+void CFeltsideView::SetHandsAside() {
+  if (m_nGameType == kGameVideoPoker) {
+    m_deck1.SetAside(m_handPoker);
+  } else if (CShoe* shoe = SelectedShoe(); shoe != nullptr) {
+    for (const CCardHand* hand : {&m_handPlayer, &m_handSplit, &m_handDealer}) {
+      shoe->SetAside(*hand);
+    }
+  }
 }
 
 void CFeltsideView::OnDeal() {
@@ -55,19 +59,16 @@ int CFeltsideView::NextCard() {
 }
 
 int CFeltsideView::DrawFrom(CShoe& shoe, std::initializer_list<const CCardHand*> out) {
-  int card = shoe.TakeCard();
+  const int card = shoe.TakeCard();
   if (card != kNoCard) return card;
   shoe.Shuffle();
-  const auto holds = [&card](const CCardHand* hand) { return hand->Contains(card); };
-  do {
-    card = shoe.TakeCard();
-  } while (std::any_of(out.begin(), out.end(), holds));
-  return card;
+  for (const CCardHand* hand : out) shoe.SetAside(*hand);
+  return shoe.TakeCard();
 }
 
 void CFeltsideView::PrepareShoe() {
   CShoe* shoe = SelectedShoe();
-  if (shoe != nullptr && shoe->GetPosition() < shoe->GetCount() - kShoeReserve) shoe->Shuffle();
+  if (shoe != nullptr && !shoe->IsNearEnd()) shoe->Shuffle();
 }
 
 void CFeltsideView::Repaint() {

@@ -80,9 +80,10 @@ class CFeltsideView : public platform::CView {
   void LowerBet();
   void PlaySplitHand();
   int NextCard();
-  /// A shoe's next card. When it has run out in the middle of a deal, it is shuffled anew and no
-  /// card comes that is out already (of several decks, none that is its equal either).
+  /// A shoe's next card. When it has run out in the middle of a deal, it is shuffled anew without
+  /// the cards that are out already.
   static int DrawFrom(CShoe& shoe, std::initializer_list<const CCardHand*> out);
+  void SetHandsAside();
   void PrepareShoe();
   /// The shoe that blackjack deals from; null for a deck choice outside 0..2.
   CShoe* SelectedShoe();
@@ -90,6 +91,9 @@ class CFeltsideView : public platform::CView {
   const CBlackjackHand& ActiveHand() const {
     return m_bPlayingSplit != 0 ? m_handSplit : m_handPlayer;
   }
+  // Of the active hand.
+  std::string& ActiveScore() { return m_bPlayingSplit != 0 ? m_strSplitScore : m_strPlayerScore; }
+  std::string& ActiveMsg() { return m_bPlayingSplit != 0 ? m_strSplitMsg : m_strPlayerMsg; }
   bool IsSplit() const { return m_handSplit.GetCount() > 0; }
   int UpCard() const { return m_handDealer.GetCard(1); }
 

@@ -32,7 +32,7 @@ bool CFeltsideView::OnKeyDown(const platform::KeyStroke& stroke) {
   if (stroke.key != platform::Key::kCharacter) return false;
   if (m_nGameType == kGameVideoPoker) return KeyMark(stroke.character);
   if (const int commandID = CommandOf(stroke.character); commandID != 0) {
-    platform::TheApp().Queue().PostCommand(commandID);
+    platform::TheApp().MainFrame()->ExecuteCommand(commandID);
     return true;
   }
   return KeyTableButton(stroke.character);
@@ -42,7 +42,7 @@ bool CFeltsideView::KeyDeal() {
   if (m_nGameType == kGameVideoPoker && m_bHandInProgress != 0) {
     DrawVideoPoker();
   } else {
-    platform::TheApp().Queue().PostCommand(kCommandDeal);
+    platform::TheApp().MainFrame()->ExecuteCommand(kCommandDeal);
   }
   return true;
 }

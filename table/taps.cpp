@@ -1,6 +1,5 @@
 // Taps on the table.
 
-#include "platform/application.h"
 #include "table/feltside_view.h"
 
 namespace feltside {

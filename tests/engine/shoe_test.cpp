@@ -52,6 +52,28 @@ TYPED_TEST(ShoeTest, DealsStackedCardsAtItsEnd) {
   EXPECT_EQ(shoe.TakeCard(), -1);
 }
 
+TYPED_TEST(ShoeTest, IsNearItsEndWithFifteenCardsLeft) {
+  TypeParam shoe;
+  shoe.Fill();
+  while (shoe.GetPosition() < shoe.GetCount() - 16) shoe.TakeCard();
+  EXPECT_FALSE(shoe.IsNearEnd());
+  shoe.TakeCard();
+  EXPECT_TRUE(shoe.IsNearEnd());
+}
+
+TYPED_TEST(ShoeTest, SetsTheCardsOfAHandAside) {
+  TypeParam shoe;
+  shoe.Shuffle();
+  const int eights = shoe.GetCount() / 52;
+  CCardHand hand;
+  hand.SetLimit(10);
+  for (int i = 0; i < eights + 2; ++i) hand.AddCard(8);  // two more than there are
+  shoe.SetAside(hand);
+  EXPECT_EQ(shoe.GetPosition(), eights);
+  EXPECT_THAT(TakeAll(shoe), testing::AllOf(testing::SizeIs(shoe.GetCount() - eights),
+                                            testing::Not(testing::Contains(8))));
+}
+
 TEST(Shoe, KnowsItsSizeAndStart) {
   EXPECT_EQ(CSingleDeck().GetCount(), 52);
   EXPECT_EQ(CFourDeckShoe().GetCount(), 208);

@@ -22,6 +22,11 @@ using platform::CProfile;
 
 class ProfileTest : public testing::Test {
  protected:
+  bool WriteString(const std::string& section, const std::string& entry, const std::string& text) {
+    return m_profile.UpdateStrings(section, {entry},
+                                   [&text](const auto&) { return std::vector{text}; });
+  }
+
   TemporaryFolder m_folder;
   const fs::path m_file = m_folder.Path() / "Maker" / "Program.toml";
   const CProfile m_profile{m_file};
@@ -56,10 +61,10 @@ TEST_F(ProfileTest, BringsAwkwardStringsBack) {
   std::mt19937 random(4711);
   for (int i = 0; i < 2000; ++i) {
     const std::string text = AwkwardText(random);
-    ASSERT_TRUE(m_profile.WriteString("S", "text", text));
+    ASSERT_TRUE(WriteString("S", "text", text));
     ASSERT_EQ(m_profile.GetString("S", "text", "absent"), text) << testing::PrintToString(text);
   }
-  EXPECT_TRUE(m_profile.WriteString("A [b]", "c = \"d\"\n", "e"));  // names may be awkward too
+  EXPECT_TRUE(WriteString("A [b]", "c = \"d\"\n", "e"));  // names may be awkward too
   EXPECT_EQ(m_profile.GetString("A [b]", "c = \"d\"\n", ""), "e");
 }
 
@@ -118,7 +123,7 @@ TEST_F(ProfileTest, KeepsACopyWhereSomethingElseThanASectionStood) {
 
 TEST_F(ProfileTest, LivesWithAFileCutOffAnywhere) {
   m_profile.WriteInt("Settings", "TABLECOLOR", 39680);
-  m_profile.WriteString("Settings", "High0", "A \"name\" 120");
+  WriteString("Settings", "High0", "A \"name\" 120");
   const std::string whole = ReadFile(m_file);
   for (std::size_t length = 0; length < whole.size(); ++length) {
     const fs::path file = m_folder.Path() / std::to_string(length) / "p.toml";

@@ -90,9 +90,13 @@ TEST_F(DealersTurn, IsOverBeforeTheWindowIsClosed) {
 
 TEST_F(DealersTurn, HandlesWhatComesInItsPausesAfterwards) {
   m_desk.Host().SetPauseHandler([&] {
-    ExpectShown({{"m_dWallet", 100.0}, {"m_handDealer", {23, 15, 4}}});
+    ExpectShown({{"m_dWallet", 100.0},
+                 {"m_handDealer", {23, 15, 4}},
+                 {"m_bHandInProgress", 0},
+                 {"m_strDealerScore", "16"}});
     m_desk.Host().PutPointer(InputKind::kPointerDown, {110, 186});  // raises the stake
-    m_desk.Host().PutKey("H");
+    // Keys struck in impatience do nothing: the result is to be read first.
+    for (const char* key : {"H", "Enter", "+"}) m_desk.Host().PutKey(key);
   });
   EXPECT_TRUE(StandBefore({}));
   const auto settled = std::find_if(m_arrStates.begin(), m_arrStates.end(), [this](const Json& s) {

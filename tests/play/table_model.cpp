@@ -94,6 +94,11 @@ std::string WrongFlags(const Json& s) {
   check(is("m_bDrawPending") == (inProgress && poker), "waits for a draw at the wrong time");
   check(bet >= 5 && bet % 5 == 0, "has an impossible stake");
   check(is("m_pTitleBitmap") == is("m_bShowTitle"), "has the title picture at the wrong time");
+  for (const char* hand : {"m_handPlayer", "m_handSplit", "m_handDealer", "m_handPoker"}) {
+    check(std::all_of(s[hand].begin(), s[hand].end(),
+                      [](const Json& c) { return c >= 1 && c <= 52; }),
+          "holds what is no card");
+  }
   check(marks == 0 || is("m_bDrawPending"), "has marks between deals");
   check(s["m_handPlayer"].size() <= 12 && s["m_handSplit"].size() <= 12, "holds too many cards");
   check(s["m_handDealer"].size() <= 5, "gave the dealer a sixth card");

@@ -37,8 +37,21 @@ const Style kCell{{15, true}, kWhite};
 const Style kResultCell{{15, true}, Rgb(180, 0, 0), kOnlyListed};
 const Style kButton{{22}, kBlack, kOnlyListed};
 const Style kAmount{{11}, Rgb(91, 152, 139), kOnlyListed};
-const std::vector<Style> kStyles = {kNormal, kMessage, kTotal,  kResult,     kBox,   kBoxTitle,
-                                    kAdvice, kCell,    kButton, kResultCell, kAmount};
+
+std::vector<Style> StylesOn(bool felt) {
+  const double onFelt = felt ? kOnlyListed : kReadable;
+  return {kNormal,
+          {{11}, kRed, onFelt},
+          {{11, true}, kRed, onFelt},
+          kResult,
+          kBox,
+          kBoxTitle,
+          kAdvice,
+          kCell,
+          kButton,
+          kResultCell,
+          kAmount};
+}
 
 struct Frame {
   std::string golden;  ///< empty: no picture of it is kept
@@ -61,7 +74,15 @@ const std::vector<Frame> kFrames = {
     {"blackjack_insurance", "", {kInsurance, kDeal, "tap 180 118"}, {kHeading, "No Insurance"}},
     {"", "", {StackOf("TH 6D 7S AC"), kDeal, "key I", "key B"}, {kHeading, "Hit"}},
     {"", "STRATTYPE = 2", {kEights, kDeal}, {kHeading, "Split"}},
-    {"", "", {kEights, kDeal, "key P"}},
+    {"", "", {kEights, kDeal, "key P", "key S"}},
+    {"", "", {kEights, kDeal, "key P", "key S", "key B"}, {kHeading, "Stand"}},
+    {"blackjack_colors",
+     "FANCYBJ = 0\nTABLECOLOR = 13166335\nBOXCOLOR = 16760960\nCARDBACK = 64",
+     {kEights, kDeal, "key P"}},
+    {"", "", {StackOf("TH 6D 7S AC"), kDeal, "tap 56 190"}},
+    {"", "", {kEleven, kDeal, "key S", "tap 110 160"}},
+    {"", "STRATTYPE = 2", {kSixteen, kDeal, "key S"}},
+    {"", "", {kSixteen, kDeal, "key B", "key S"}},
     {"blackjack_split", "CARDBACK = 61", {kEights, kDeal, "key P", "key S", "key H"}},
     {"", "", {kEights, kDeal, "key P", "key D", "key S"}},
     {"", "", {StackOf("8C 8D TS JH 3S 2H"), kDeal, "key P", "key S", "key S"}},
@@ -77,7 +98,7 @@ const std::vector<Frame> kFrames = {
     {"blackjack_negative_wallet", "", {"wallet -5.5", StackOf("TH 8D KS 9C"), kDeal, "key S"}},
     {"blackjack_advice", "STRATTYPE = 2", {kEleven, kDeal}, {kHeading, "Double Down"}},
     {"poker_dealt", "GAME_TYPE = 1", {kPoker, kDeal}},
-    {"poker_marked", "GAME_TYPE = 1", {kPoker, kDeal, "key 1", "key 4", "key 5"}},
+    {"poker_marked", "GAME_TYPE = 1\nCARDBACK = 59", {kPoker, kDeal, "key 1", "key 4", "key 5"}},
     {"poker_won", "GAME_TYPE = 1", {kPoker, kDeal, "key 1", "key Enter"}},
     {"poker_negative_wallet", "GAME_TYPE = 1", {"wallet -12.5", kPoker, kDeal, "key Enter"}},
     {"plain_poker_dealt", "GAME_TYPE = 1\nFANCYVP = 0", {kPoker, kDeal}},
@@ -139,11 +160,14 @@ TEST(Frames, LookAsTheyDidAndCanBeRead) {
     const CBitmap table = TableOf(*stylus);
     if (!frame.golden.empty()) ExpectGolden(table, frame.golden);
     const Json state = stylus->Send("state");
-    std::vector<Style> styles = kStyles;
     // The felt's colour is the player's choice.
-    if (state["m_bFancyBlackjack"] == 0) styles[1].bound = styles[2].bound = kOnlyListed;
-    ExpectReadable(table, TextsOf(state), styles);
-    ExpectReadable(table, frame.advice, styles);
+    const bool felt = state["m_bFancyBlackjack"] == 0;
+    ExpectReadable(table, TextsOf(state), StylesOn(felt));
+    ExpectReadable(table, frame.advice, StylesOn(felt));
+    EXPECT_EQ(PlacesOf(table, kHeading, kAdvice).empty(), frame.advice.empty());
+    // Every operation has painted what it changed: painting anew brings nothing else.
+    stylus->Send("wallet " + state["m_dWallet"].dump());
+    EXPECT_EQ(TableOf(*stylus), table);
   }
 }
 

@@ -6,6 +6,8 @@
 #include <utility>
 
 #include "render/table_layout.h"
+#include "shell/feltside_app.h"
+#include "tests/support/golden.h"
 
 namespace feltside::tests {
 namespace {
@@ -102,6 +104,36 @@ TEST_P(TableLayoutTest, FindsTheCardUnderAPoint) {
       ASSERT_EQ(m_layout.HitTestCard({x, y}), onCard ? (x - first.x) / 33 : -1) << x << ", " << y;
     }
   }
+}
+
+/// Everything that is placed by the client area, on a sheet of its size.
+TEST_P(TableLayoutTest, DrawsInAnyClientArea) {
+  const CFeltsideApp app;
+  const Rect client = GetParam().client;
+  platform::CBitmap sheet({client.right, client.bottom}, platform::Rgb(0, 155, 0));
+  platform::CSurface surface(sheet);
+  CTableLayout layout = m_layout;
+  layout.Prepare(surface, client);
+  layout.DrawPayTable();
+  layout.DrawPlayButton(true);
+  layout.DrawPlayerBox(5, 100, false);
+  layout.DrawVerdictLamp(true);
+  layout.DrawAdvice("Hit");
+  layout.DrawStrategyButton();
+  layout.DrawInsuranceButtons();
+  for (const int position : {POS_BOTTOM, POS_TOP}) {
+    layout.DrawLabel(position, "Name");
+    layout.DrawHandText(position, "21", true);
+  }
+  layout.DrawAmount(POS_BOTTOM, 7);
+  layout.DrawHandText(POS_ABOVE_BOTTOM, "Push!", false);
+  layout.DrawActiveMarker(POS_BOTTOM_LEFT);
+  // None of these is a card or a place for one.
+  for (const int number : {-1, 0, 66}) layout.DrawCard(POS_BOTTOM, 1, number);
+  layout.DrawCard(-1, 1, 27);
+  layout.DrawCard(POS_BOTTOM, -1, 27);
+  layout.DrawCard(POS_BOTTOM, 4, 65);
+  ExpectGolden(sheet, "layout_" + std::to_string(client.right));
 }
 
 INSTANTIATE_TEST_SUITE_P(Areas, TableLayoutTest, testing::ValuesIn(kAreas));
