@@ -33,8 +33,12 @@ std::vector<std::string> WrapText(const std::string& text, int width) {
 std::string Ellipsized(const std::string& text, int width) {
   if (MeasureText(kSystemFont, text).width <= width) return text;
   const std::string ellipsis = "\xE2\x80\xA6";
-  const int room = width - MeasureText(kSystemFont, ellipsis).width;
-  return text.substr(0, FittingLength(kSystemFont, text, room)) + ellipsis;
+  const std::size_t blank = text.rfind(' ');
+  std::string end = ellipsis + (blank == std::string::npos ? "" : text.substr(blank));
+  // A last word that leaves little room is cut like the rest.
+  if (MeasureText(kSystemFont, end).width > width / 2) end = ellipsis;
+  const int room = width - MeasureText(kSystemFont, end).width;
+  return text.substr(0, FittingLength(kSystemFont, text, room)) + end;
 }
 
 }  // namespace platform

@@ -11,8 +11,8 @@ namespace platform {
 /// wider still stands alone.
 std::vector<std::string> WrapText(const std::string& text, int width);
 
-/// A text that fits so many pixels of system type: itself, or cut at a letter and ended by an
-/// ellipsis.
+/// A text that fits so many pixels of system type: itself, or cut at a letter, with an ellipsis in
+/// place of what is missing before its last word.
 std::string Ellipsized(const std::string& text, int width);
 
 }  // namespace platform

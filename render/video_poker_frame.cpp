@@ -1,5 +1,7 @@
 // One video-poker frame, from the state of the table.
 
+#include <cmath>
+
 #include "render/number_text.h"
 #include "table/feltside_view.h"
 
@@ -49,7 +51,8 @@ void CFeltsideView::DrawFancyPokerTexts(platform::CSurface& surface) {
   surface.SetBackColor(kButtonCell);
   surface.TextOut(kButtonTextAt, m_bHandInProgress == 0 ? "Deal" : "Play");
   surface.SetBackColor(kWalletCell);
-  surface.TextOut(kWalletTextAt, NumberText("$%.0f", m_dWallet));
+  // Halves always go up, so that every deal shows a dollar less.
+  surface.TextOut(kWalletTextAt, NumberText("$%.0f", std::floor(m_dWallet + 0.5)));
   surface.SetBackColor(kResultCell);
   surface.SetTextColor(kResultColor);
   surface.TextOut(kResultTextAt, m_strPlayerMsg);

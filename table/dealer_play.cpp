@@ -32,6 +32,10 @@ bool AsksToLeave(const platform::Message& message) {
 void CFeltsideView::DealerPlay() {
   m_bHandInProgress = 0;
   m_strDealerScore = std::to_string(m_handDealer.GetTotal());
+  // None of what arrives may touch the deal being settled: the disabled frame refuses taps, keys
+  // and commands, and shows its buttons grey.
+  TopLevel().EnableWindow(false);
+  platform::TheApp().MainFrame()->RefreshCommandStates();
   PumpMessages();
   while (m_handDealer.GetTotal() < kDealerStands && m_handDealer.GetCount() < kDealerCards) {
     m_handDealer.AddCard(NextCard());
@@ -41,15 +45,14 @@ void CFeltsideView::DealerPlay() {
   }
   // A key struck in impatience would deal anew before the result could be read.
   platform::TheApp().Queue().DropKeys();
+  TopLevel().EnableWindow(true);
   Settle();
 }
 
-/// Handles what was already waiting when the dealer began. None of it may touch the deal being
-/// settled: play commands are dropped, and the disabled frame refuses taps, keys and all other
-/// commands.
+/// Handles what was already waiting when the dealer began. Play commands are dropped; what asks to
+/// leave waits on.
 void CFeltsideView::PumpMessages() {
   platform::CApplication& app = platform::TheApp();
-  TopLevel().EnableWindow(false);
   std::vector<platform::Message> leaving;
   platform::Message message;
   while (app.Queue().Peek(message)) {
@@ -60,7 +63,6 @@ void CFeltsideView::PumpMessages() {
     }
   }
   for (const platform::Message& waiting : leaving) app.Queue().Post(waiting);
-  TopLevel().EnableWindow(true);
 }
 
 void CFeltsideView::Settle() {

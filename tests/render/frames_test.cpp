@@ -140,7 +140,7 @@ Texts TextsOf(const Json& state) {
   }
   Texts texts = {state["m_bHandInProgress"] == 0 ? "Deal" : "Play", state["m_strPlayerMsg"]};
   if (state["m_bFancyPoker"] == 1) {
-    texts.push_back(NumberText("$%.0f", wallet));
+    texts.push_back(NumberText("$%.0f", std::floor(wallet + 0.5)));
   } else {
     // A single digit might be found on a card; it stands on the same white as all of these.
     for (const char* text :
