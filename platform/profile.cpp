@@ -75,8 +75,10 @@ void SetAside(const fs::path& file) {
 
 fs::path LockOf(const fs::path& file) { return file.string() + ".lock"; }
 
-/// Reads under the lock that the caller holds, and sets aside what cannot be understood.
-ReadProfile ReadLocked(const fs::path& file) {
+/// Reads under a lock, and sets aside what cannot be understood. A file that another game holds
+/// cannot be read.
+ReadProfile ReadLocked(const fs::path& file, const CFileLock& lock) {
+  if (lock.IsRefused()) return {Reading::kUnreadable, {}};
   ReadProfile profile = Read(file);
   if (profile.reading == Reading::kDamaged) SetAside(file);
   return profile;
@@ -88,7 +90,7 @@ ReadProfile ReadUnlocked(const fs::path& file) {
   ReadProfile profile = Read(file);
   if (profile.reading != Reading::kDamaged) return profile;
   const CFileLock lock(LockOf(file));
-  return ReadLocked(file);
+  return ReadLocked(file, lock);
 }
 
 /// Keeps a copy of a file in which something stands, under this name, that is not what must be
@@ -121,9 +123,9 @@ bool Update(const fs::path& file, const std::string& section, const std::string&
   std::error_code error;
   fs::create_directories(file.parent_path(), error);
   const CFileLock lock(LockOf(file));
-  ReadProfile profile = ReadLocked(file);
+  ReadProfile profile = ReadLocked(file, lock);
   bool written = false;
-  if (profile.reading != Reading::kUnreadable && !lock.IsRefused()) {
+  if (profile.reading != Reading::kUnreadable) {
     if (profile.values.contains(section) && !profile.values[section].is_table()) {
       KeepCopy(file, section);
       profile.values.erase(section);
