@@ -46,8 +46,8 @@ bool MayBeWritten(const std::filesystem::path& file) {
 
 CFileLock::CFileLock(const std::filesystem::path& lockFile)
     : m_nDescriptor(open(lockFile.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)) {
-  constexpr int kTries = 200;
-  constexpr useconds_t kBetween = 10000;  // microseconds
+  constexpr int kTries = 2000;
+  constexpr useconds_t kBetween = 1000;  // microseconds; short, as others come between
   for (int i = 0; m_nDescriptor >= 0 && flock(m_nDescriptor, LOCK_EX | LOCK_NB) != 0; ++i) {
     m_bRefused = i >= kTries;
     if (m_bRefused || (errno != EWOULDBLOCK && errno != EINTR)) break;
