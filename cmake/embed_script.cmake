@@ -12,7 +12,7 @@ foreach(file IN LISTS FILES)
   string(APPEND entries "    {\"${base}\", kFile${number}, sizeof kFile${number}},\n")
   math(EXPR number "${number} + 1")
 endforeach()
-file(WRITE "${SOURCE}" "#include \"platform/embedded.h\"
+file(WRITE "${SOURCE}" "#include \"platform/draw/embedded.h\"
 
 namespace ${namespace} {
 namespace {

@@ -5,7 +5,7 @@
 #include <string>
 #include <utility>
 
-#include "platform/message_box.h"
+#include "platform/dialog/message_box.h"
 
 namespace feltside {
 

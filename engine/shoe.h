@@ -3,7 +3,7 @@
 #include <vector>
 
 #include "engine/card_hand.h"
-#include "platform/runtime.h"
+#include "platform/host/runtime.h"
 
 namespace feltside {
 

@@ -1,6 +1,6 @@
 // What only the blackjack table shows.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "render/number_text.h"
 #include "render/table_layout.h"
 

@@ -1,6 +1,6 @@
 // What every drawing of the table is put together from: cards, labels, hand texts and pictures.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "render/table_layout.h"
 
 namespace feltside {

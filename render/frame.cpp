@@ -1,7 +1,7 @@
 // How a frame is put together: the title until the first deal, then the table, composed off screen
 // and shown in one transfer.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "table/feltside_view.h"
 
 namespace feltside {

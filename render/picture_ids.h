@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/geometry.h"
+#include "platform/draw/geometry.h"
 
 namespace feltside {
 

@@ -3,7 +3,7 @@
 #include <string>
 
 #include "engine/card_hand.h"
-#include "platform/surface.h"
+#include "platform/draw/surface.h"
 #include "render/picture_ids.h"
 
 namespace feltside {

@@ -2,8 +2,8 @@
 
 #include <array>
 
-#include "platform/slider.h"
-#include "platform/up_down.h"
+#include "platform/dialog/slider.h"
+#include "platform/dialog/up_down.h"
 #include "shell/res/dialog_templates.h"
 
 namespace feltside {

@@ -3,7 +3,7 @@
 #include <array>
 #include <memory>
 
-#include "platform/document_template.h"
+#include "platform/window/document_template.h"
 #include "shell/about_dlg.h"
 #include "shell/feltside_doc.h"
 #include "shell/main_frame.h"
@@ -25,7 +25,7 @@ struct CFeltsideApp::Commands {
 
 CFeltsideApp& TheFeltsideApp() { return static_cast<CFeltsideApp&>(platform::TheApp()); }
 
-CFeltsideApp::CFeltsideApp() : CApplication("Feltside", PictureFiles()) {}
+CFeltsideApp::CFeltsideApp() : CApplication("Feltside", PictureFiles(), kWindowSize) {}
 
 platform::CommandState CFeltsideApp::QueryCommand(int commandID) const {
   return QueryCommandMap(*this, Commands::kMap, commandID);

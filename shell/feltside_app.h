@@ -4,7 +4,7 @@
 #include <utility>
 #include <vector>
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 
 namespace feltside {
 

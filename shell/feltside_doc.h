@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/document_template.h"
+#include "platform/window/document_template.h"
 
 namespace feltside {
 

@@ -1,6 +1,6 @@
 // The view's commands that have to do with the high scores: showing them, and leaving the table.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "shell/feltside_app.h"
 #include "shell/high_scores_dlg.h"
 #include "table/feltside_view.h"

@@ -1,6 +1,6 @@
 #include "shell/high_scores_dlg.h"
 
-#include "platform/message_box.h"
+#include "platform/dialog/message_box.h"
 #include "shell/feltside_app.h"
 #include "shell/res/dialog_templates.h"
 

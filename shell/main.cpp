@@ -1,9 +1,9 @@
 #include <cstdlib>
 #include <iostream>
 
-#include "platform/screen.h"
-#include "platform/sdl_host.h"
+#include "platform/host/sdl_host.h"
 #include "shell/feltside_app.h"
+#include "shell/res/frame_resources.h"
 
 namespace {
 /// Tells a caller that nothing but a display was missing.
@@ -12,7 +12,8 @@ constexpr int kExitNoDisplay = 3;
 
 int main(int, char**) {
   std::string why;
-  const auto host = platform::CreateSdlHost(platform::CScreen::kSize, why);
+  const auto host = platform::CreateSdlHost(
+      {feltside::kWindowSize, {"../share/feltside/help", FELTSIDE_HELP_FOLDER}}, why);
   if (host == nullptr) {
     std::cerr << "Feltside: " << why << '\n';
     return kExitNoDisplay;

@@ -2,7 +2,7 @@
 
 #include <array>
 
-#include "platform/host.h"
+#include "platform/host/host.h"
 #include "shell/res/frame_resources.h"
 #include "table/command_ids.h"
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/command_bar.h"
-#include "platform/frame_window.h"
+#include "platform/window/command_bar.h"
+#include "platform/window/frame_window.h"
 
 namespace feltside {
 

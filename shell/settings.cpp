@@ -4,7 +4,7 @@
 
 #include <array>
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "table/feltside_view.h"
 
 namespace feltside {

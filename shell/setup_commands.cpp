@@ -1,7 +1,7 @@
 // The setup commands: they show the table's settings in a dialog and, when it is confirmed, take
 // them over, keep them and repaint.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "shell/settings.h"
 #include "shell/setup_dlg.h"
 #include "shell/setup_table_dlg.h"

@@ -1,7 +1,7 @@
 #include "shell/setup_dlg.h"
 
-#include "platform/combo_box.h"
-#include "platform/host.h"
+#include "platform/dialog/combo_box.h"
+#include "platform/host/host.h"
 #include "shell/res/dialog_templates.h"
 
 namespace feltside {

@@ -1,8 +1,8 @@
 #include "shell/setup_table_dlg.h"
 
-#include "platform/application.h"
-#include "platform/combo_box.h"
-#include "platform/host.h"
+#include "platform/dialog/combo_box.h"
+#include "platform/host/host.h"
+#include "platform/window/application.h"
 #include "shell/edit_color_dlg.h"
 #include "shell/res/dialog_templates.h"
 

@@ -2,8 +2,7 @@
 
 #include <vector>
 
-#include "platform/application.h"
-#include "platform/runtime.h"
+#include "platform/window/application.h"
 #include "table/command_ids.h"
 #include "table/feltside_view.h"
 

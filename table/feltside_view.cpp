@@ -4,8 +4,7 @@
 #include <limits>
 
 namespace feltside {
-CFeltsideView::CFeltsideView(platform::CFrameWindow& frame)
-    : CView(&frame, platform::CFrameWindow::ViewPlace()) {}
+CFeltsideView::CFeltsideView(platform::CFrameWindow& frame) : CView(&frame, frame.ViewPlace()) {}
 
 void CFeltsideView::OnInitialUpdate() {
   CView::OnInitialUpdate();

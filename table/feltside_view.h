@@ -7,8 +7,8 @@
 
 #include "engine/blackjack_hand.h"
 #include "engine/shoe.h"
-#include "platform/frame_window.h"
-#include "platform/view.h"
+#include "platform/window/frame_window.h"
+#include "platform/window/view.h"
 #include "render/table_layout.h"
 
 namespace feltside {

@@ -1,6 +1,6 @@
 // The table played by keyboard. A key works exactly when the button that it stands for would.
 
-#include "platform/application.h"
+#include "platform/window/application.h"
 #include "table/command_ids.h"
 #include "table/feltside_view.h"
 

@@ -3,7 +3,7 @@
 #include <algorithm>
 
 #include "engine/poker.h"
-#include "platform/message_box.h"
+#include "platform/dialog/message_box.h"
 #include "table/feltside_view.h"
 
 namespace feltside {

@@ -11,21 +11,30 @@ from pathlib import Path
 
 ROOT = Path(__file__).resolve().parent.parent
 
+DRAW, HOST, STORE, WINDOW, DIALOG = (
+    f"platform/{room}/" for room in ("draw", "host", "store", "window", "dialog"))
+PLATFORM = (DRAW, HOST, STORE, WINDOW, DIALOG)
 GAME = ("engine/", "render/", "table/", "shell/")
-DRAWING = tuple(f"platform/{name}.h" for name in ("bitmap", "color", "geometry", "surface", "text"))
+LAYOUT = ("render/table_layout.h", "render/picture_ids.h")
 
-# The first line whose beginning fits a file holds for it: what of ours it may include, by beginning.
+# What of ours a file may include, by beginnings. The first line whose beginning fits the file holds
+# for it; a file that none fits lies where nothing of ours belongs.
 OURS = [
-    ("engine/", ("engine/", "platform/runtime.h", "platform/message_box.h")),
-    ("render/table_layout", ("render/table_layout.h", "render/picture_ids.h", "engine/") + DRAWING),
-    ("render/picture_ids", DRAWING),
-    ("render/", ("engine/", "render/", "platform/", "table/feltside_view.h")),
-    ("table/", ("engine/", "render/", "table/", "platform/")),
-    ("shell/", GAME + ("platform/",)),
-    ("platform/", ("platform/",)),
-    ("tests/", GAME + ("platform/", "tests/")),
-    ("bench/", GAME + ("platform/", "bench/")),
-    ("fuzz/", GAME + ("platform/", "fuzz/")),
+    (DRAW, (DRAW,)),
+    (HOST, (DRAW, HOST)),
+    (STORE, (HOST, STORE)),
+    (WINDOW, (DRAW, HOST, STORE, WINDOW)),
+    (DIALOG, PLATFORM),
+    ("engine/", ("engine/", f"{HOST}runtime.h", f"{DIALOG}message_box.h")),
+    ("render/table_layout", LAYOUT + ("engine/", DRAW)),
+    ("render/picture_ids", (DRAW,)),
+    ("render/", ("engine/", "render/", "table/feltside_view.h") + PLATFORM),
+    ("table/", ("engine/", "render/", "table/") + PLATFORM),
+    ("shell/", GAME + PLATFORM),
+    ("stylus/", GAME + PLATFORM + ("stylus/",)),
+    ("tests/", GAME + PLATFORM + ("stylus/", "tests/")),
+    ("bench/", GAME + PLATFORM + ("stylus/", "bench/")),
+    ("fuzz/", GAME + PLATFORM + ("stylus/", "fuzz/")),
 ]
 
 SDL = r"SDL.*"
@@ -35,9 +44,11 @@ JSON = r"nlohmann/.*"
 
 # The same for the headers of libraries.
 LIBRARIES = [
-    (r"platform/sdl_\w+\.h", SDL),
-    (r"platform/\w+\.cpp", f"{SDL}|png\\.h|malloc\\.h|freetype/.*|toml\\+\\+/.*|{SYSTEM}"),
-    (r"shell/.*", JSON),
+    (r"platform/draw/\w+\.cpp", r"png\.h|freetype/.*|utf8.*"),
+    (r"platform/host/sdl_\w+\.h", SDL),
+    (r"platform/host/\w+\.cpp", f"{SDL}|malloc\\.h|{SYSTEM}"),
+    (r"platform/store/\w+\.cpp", rf"toml\+\+/.*|{SYSTEM}"),
+    (r"stylus/.*", JSON),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|dlfcn\\.h"),
     (r"fuzz/.*", SYSTEM),
@@ -61,11 +72,13 @@ def includes_of(text):
             yield number, match[1] == '"', match[2]
 
 
+def allowed_to(path):
+    """What of ours a file may include; None where no rule names its folder."""
+    return next((allowed for beginning, allowed in OURS if path.startswith(beginning)), None)
+
+
 def may_include_ours(path, included):
-    for beginning, allowed in OURS:
-        if path.startswith(beginning):
-            return included.startswith(allowed)
-    return True
+    return included.startswith(allowed_to(path) or ())
 
 
 def is_standard(included):
@@ -104,11 +117,16 @@ class Checker:
     def check_names(self, path, text):
         """Even by name the libraries are known to the layer alone, and to what the game is measured
         against."""
-        if re.fullmatch(r"platform/(\w+\.cpp|sdl_\w+\.h)|bench/\w+\.cpp", path):
+        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|bench/\w+\.cpp", path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
             if match := LIBRARY_NAME.search(line):
                 self.fault(path, number, f"may not use {match[0]}")
+
+    def check_game(self, path, text):
+        """The layer knows no game, not even by name."""
+        if path.startswith(PLATFORM) and (match := re.search("feltside", text, re.IGNORECASE)):
+            self.fault(path, 1 + text.count("\n", 0, match.start()), "names the game")
 
     def reached_from(self, path, seen):
         """All of our headers that a file includes, through others too."""
@@ -129,8 +147,11 @@ class Checker:
 
     def run(self):
         for path, text in self.texts.items():
+            if allowed_to(path) is None:
+                self.fault(path, 1, "lies in a folder that no rule names")
             self.check_includes(path, text)
             self.check_names(path, text)
+            self.check_game(path, text)
             self.check_reach(path)
             if path.endswith(".h") and not re.search(r"^#pragma once$", text, re.MULTILINE):
                 self.fault(path, 1, "has no #pragma once")

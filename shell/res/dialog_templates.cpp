@@ -1,6 +1,6 @@
 #include "shell/res/dialog_templates.h"
 
-#include "platform/dialog.h"
+#include "platform/dialog/dialog.h"
 #include "render/picture_ids.h"
 
 namespace feltside {

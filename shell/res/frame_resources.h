@@ -2,10 +2,13 @@
 
 #include <vector>
 
-#include "platform/command_bar.h"
-#include "platform/frame_window.h"
+#include "platform/window/command_bar.h"
+#include "platform/window/frame_window.h"
 
 namespace feltside {
+
+/// The whole window in pixels: the command bar above a table of 240 × 268.
+inline constexpr platform::Size kWindowSize{240, 294};
 
 /// Menu, tool bar, accelerators, document string and icon of the main frame share this number.
 inline constexpr int IDR_MAINFRAME = 128;

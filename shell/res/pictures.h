@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/embedded.h"
+#include "platform/draw/embedded.h"
 
 namespace feltside {
 

@@ -1,6 +1,6 @@
 // The profile store, also when its file is not what it should be, and when the program dies.
 
-#include "platform/profile.h"
+#include "platform/store/profile.h"
 
 #include <gtest/gtest.h>
 #include <sys/wait.h>

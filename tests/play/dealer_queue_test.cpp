@@ -2,7 +2,7 @@
 
 #include <gmock/gmock.h>
 
-#include "platform/frame_window.h"
+#include "platform/window/frame_window.h"
 #include "table/command_ids.h"
 #include "tests/support/desk.h"
 #include "tests/support/script.h"

@@ -6,7 +6,7 @@
 #include <cmath>
 #include <map>
 
-#include "platform/look.h"
+#include "platform/draw/look.h"
 
 namespace feltside::tests {
 namespace {

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/surface.h"
+#include "platform/draw/surface.h"
 
 namespace feltside::tests {
 

@@ -2,8 +2,8 @@
 
 #include <gtest/gtest.h>
 
-#include "platform/look.h"
-#include "platform/wrapped_text.h"
+#include "platform/draw/look.h"
+#include "platform/draw/wrapped_text.h"
 #include "tests/render/contrast.h"
 #include "tests/support/golden.h"
 #include "tests/support/script.h"

@@ -3,8 +3,8 @@
 
 #include <gtest/gtest.h>
 
-#include "platform/look.h"
-#include "platform/resources.h"
+#include "platform/draw/look.h"
+#include "platform/draw/resources.h"
 #include "render/number_text.h"
 #include "shell/res/pictures.h"
 #include "tests/render/contrast.h"

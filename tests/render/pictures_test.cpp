@@ -6,7 +6,7 @@
 
 #include <set>
 
-#include "platform/resources.h"
+#include "platform/draw/resources.h"
 #include "render/picture_ids.h"
 
 namespace feltside::tests {

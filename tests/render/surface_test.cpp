@@ -1,12 +1,12 @@
 // The drawing calls themselves, by single pixels.
 
-#include "platform/surface.h"
+#include "platform/draw/surface.h"
 
 #include <gtest/gtest.h>
 
 #include <functional>
 
-#include "platform/resources.h"
+#include "platform/draw/resources.h"
 #include "tests/support/golden.h"
 
 namespace feltside::tests {

@@ -4,7 +4,7 @@
 #include <mutex>
 #include <thread>
 
-#include "platform/frame_window.h"
+#include "platform/window/frame_window.h"
 
 namespace feltside::tests {
 namespace {

@@ -3,10 +3,10 @@
 #include <functional>
 #include <string>
 
-#include "platform/dialog.h"
-#include "platform/offscreen_host.h"
+#include "platform/dialog/dialog.h"
+#include "platform/host/offscreen_host.h"
 #include "shell/feltside_app.h"
-#include "shell/table_state.h"
+#include "stylus/table_state.h"
 #include "tests/support/stylus.h"
 
 namespace feltside::tests {

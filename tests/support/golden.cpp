@@ -5,7 +5,7 @@
 #include <cstdlib>
 #include <filesystem>
 
-#include "platform/resources.h"
+#include "platform/draw/resources.h"
 
 namespace feltside::tests {
 namespace {

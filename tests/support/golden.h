@@ -2,7 +2,7 @@
 
 #include <string>
 
-#include "platform/bitmap.h"
+#include "platform/draw/bitmap.h"
 
 namespace feltside::tests {
 

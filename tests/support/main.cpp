@@ -2,7 +2,7 @@
 
 #include <csignal>
 
-#include "platform/offscreen_host.h"
+#include "platform/host/offscreen_host.h"
 #include "tests/support/temporary_folder.h"
 
 namespace {

@@ -10,7 +10,7 @@
 #include <memory>
 #include <stdexcept>
 
-#include "platform/resources.h"
+#include "platform/draw/resources.h"
 
 namespace feltside::tests {
 namespace {

@@ -7,7 +7,7 @@
 #include <nlohmann/json.hpp>
 #include <string>
 
-#include "platform/bitmap.h"
+#include "platform/draw/bitmap.h"
 #include "tests/support/temporary_folder.h"
 
 namespace feltside::tests {

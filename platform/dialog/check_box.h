@@ -1,0 +1,28 @@
+#pragma once
+
+#include "platform/dialog/press_control.h"
+
+namespace platform {
+
+/// A box that ticks and clears itself: by a press that ends on it, by Space, or by its mnemonic.
+/// Its text is wrapped to its width.
+class CCheckBox : public CPressControl {
+ public:
+  using CPressControl::CPressControl;
+
+  const char* KindName() const override { return "check"; }
+  int GetValue() const override { return m_bChecked ? 1 : 0; }
+  void SetCheck(bool checked);
+  /// Ticks a clear box and clears a ticked one.
+  void Activate() override;
+
+  void OnPaint(CSurface& surface) override;
+  bool OnKeyDown(const KeyStroke& stroke) override;
+
+ private:
+  void DrawBox(CSurface& surface, const Rect& box) const;
+
+  bool m_bChecked = false;
+};
+
+}  // namespace platform

@@ -1,0 +1,46 @@
+#pragma once
+
+#include <map>
+#include <optional>
+#include <string>
+
+#include "platform/draw/bitmap.h"
+#include "platform/draw/embedded.h"
+
+namespace platform {
+
+/// The pictures built into the program, by number: files named "NNN_subject.png" are bitmaps, files
+/// named "icon_NNN_subject.png" icons. Each is decoded once, when it is first asked for.
+class CResources {
+ public:
+  explicit CResources(EmbeddedFiles files) : m_files(files) {}
+
+  /// The bitmap of that number. Where there is none, or it cannot be decoded: a framed blank of the
+  /// given size that bears the number, the same from then on.
+  const CBitmap& LoadBitmap(int resourceID, Size blank);
+  /// The same for who keeps it: decoded for this call alone.
+  CBitmap ReadBitmap(int resourceID, Size blank) const;
+  /// The icon of that number, with the same rule.
+  const CBitmap& LoadIcon(int resourceID, Size blank);
+  /// The picture of an icon that comes in several sizes, by its width in pixels; nothing where it
+  /// does not come in that size.
+  std::optional<CBitmap> LoadIconOfSize(int resourceID, int width) const;
+
+ private:
+  const CBitmap& Load(const std::string& kind, int resourceID, Size blank);
+  CBitmap Read(const std::string& prefix, int resourceID, Size blank) const;
+
+  EmbeddedFiles m_files;
+  std::map<std::string, CBitmap> m_mapLoaded;
+};
+
+/// A picture of a file that could be read; nothing otherwise.
+std::optional<CBitmap> DecodePicture(const EmbeddedFile& file);
+
+/// Writes a bitmap as a PNG file; answers whether it was written.
+bool SavePng(const CBitmap& bitmap, const std::string& path);
+
+/// Reads a PNG file; nothing where it cannot be read.
+std::optional<CBitmap> LoadPng(const std::string& path);
+
+}  // namespace platform

@@ -1,0 +1,28 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+#include "platform/draw/bitmap.h"
+#include "platform/draw/geometry.h"
+
+namespace platform {
+
+/// A face of the one type family, by its cell height in pixels: 11, 13, 14, 15 or 22. Any other
+/// height takes the nearest of these.
+struct Font {
+  int height = 13;
+  bool bold = false;
+};
+
+/// The extent of a UTF-8 text; an empty text is 0 wide and a cell high.
+Size MeasureText(const Font& font, const std::string& text);
+
+/// How much of a text, in bytes and whole letters from its start, is at most so many pixels wide.
+std::size_t FittingLength(const Font& font, const std::string& text, int width);
+
+/// The text as a stencil of its extent: opaque pixels where ink stands, see-through ones elsewhere.
+/// A letter that the face lacks shows as a box.
+CBitmap RenderText(const Font& font, const std::string& text);
+
+}  // namespace platform

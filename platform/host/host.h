@@ -1,0 +1,54 @@
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <optional>
+#include <string>
+
+#include "platform/draw/bitmap.h"
+#include "platform/host/input.h"
+#include "platform/host/runtime.h"
+
+namespace platform {
+
+/// The one door to the machine: all that the layer needs of it. A port writes one of these.
+class Host {
+ public:
+  Host() = default;
+  virtual ~Host() = default;
+  Host(const Host&) = delete;
+  Host& operator=(const Host&) = delete;
+
+  /// Puts a whole picture of the program's window, always of the same size, before the person.
+  virtual void Show(const CBitmap& frame) = 0;
+  /// Names the window and gives it an icon, where there is one.
+  virtual void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) = 0;
+
+  /// Takes the oldest input that has come, without waiting. False: there is none.
+  virtual bool NextEvent(InputEvent& event) = 0;
+  /// Returns when input may have come, or after so many milliseconds; below 0: however long it
+  /// takes.
+  virtual void WaitEvent(int milliseconds) = 0;
+
+  /// A steady clock, in milliseconds.
+  virtual std::int64_t Ticks() = 0;
+  virtual LocalTime Now() = 0;
+
+  /// Whether typed text is wanted: a device without a keyboard shows one while it is.
+  virtual void SetTextInput(bool wanted) = 0;
+  virtual std::string GetClipboard() = 0;
+  virtual void SetClipboard(const std::string& text) = 0;
+
+  /// Starts the help viewer with a command line such as "file:page.htm#topic", beside the program.
+  /// Nothing tells whether it came up.
+  virtual void StartHelpViewer(const std::string& commandLine) = 0;
+  /// The folder that keeps programs' settings; it need not exist yet.
+  virtual std::filesystem::path ProfileFolder() = 0;
+};
+
+/// The host of this process. SetHost comes before anything else of the layer; the host stays its
+/// owner's and must outlive the program.
+void SetHost(Host* host);
+Host& TheHost();
+
+}  // namespace platform

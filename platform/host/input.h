@@ -1,0 +1,67 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "platform/draw/geometry.h"
+
+namespace platform {
+
+/// A key by what it does. Letters, digits and signs are kCharacter.
+enum class Key {
+  kNone,
+  kCharacter,
+  kEnter,
+  kEscape,
+  kTab,
+  kBackspace,
+  kDelete,
+  kInsert,
+  kUp,
+  kDown,
+  kLeft,
+  kRight,
+  kHome,
+  kEnd,
+  kPageUp,
+  kPageDown,
+  kF1,
+  kF4,
+  kF10,
+};
+
+/// A pressed key with what was held down beside it.
+struct KeyStroke {
+  Key key = Key::kNone;
+  char character = 0;  ///< for kCharacter: 'A'..'Z', '0'..'9', ' ', '+', '-' ...; else 0
+  bool ctrl = false;
+  bool alt = false;
+  bool shift = false;
+
+  friend constexpr bool operator==(const KeyStroke&, const KeyStroke&) = default;
+};
+
+/// The key stroke that a text such as "Enter", "Alt+B", "Ctrl+N" or "Shift+Tab" names; nothing
+/// where it names none.
+std::optional<KeyStroke> ParseChord(const std::string& text);
+
+enum class InputKind {
+  kPointerDown,
+  kPointerMove,  ///< while the stylus is down or the mouse hovers
+  kPointerUp,
+  kWheel,
+  kKey,
+  kText,
+  kClose,  ///< the window's close button, or the desktop asking the program to end
+};
+
+/// One thing that a person did. Pointer places are pixels of the whole window.
+struct InputEvent {
+  InputKind kind = InputKind::kKey;
+  Point at;
+  int wheel = 0;  ///< notches, away from the person is positive
+  KeyStroke stroke;
+  std::string text;  ///< UTF-8
+};
+
+}  // namespace platform

@@ -1,0 +1,61 @@
+#pragma once
+
+#include <deque>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "platform/host/host.h"
+
+namespace platform {
+
+/// A host without a machine: no display, input that is put in by hand, a clock that stands still
+/// until it is told to move (waiting moves it), the shown pictures kept for the asking.
+class OffscreenHost : public Host {
+ public:
+  explicit OffscreenHost(std::filesystem::path profileFolder)
+      : m_profileFolder(std::move(profileFolder)) {}
+
+  void PutInput(const InputEvent& event) { m_arrInput.push_back(event); }
+  void SetClock(const LocalTime& now);
+  /// Called when the program waits for input and there is none, again and again until it has put
+  /// some in. Once it answers false, and without a handler, the window is closed.
+  void SetIdleHandler(std::function<bool()> onIdle) { m_onIdle = std::move(onIdle); }
+  /// Called with every shown picture.
+  void SetFrameHandler(std::function<void(const CBitmap&)> onFrame) {
+    m_onFrame = std::move(onFrame);
+  }
+
+  const CBitmap& Shown() const { return m_shown; }
+  const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
+  bool WantsText() const { return m_bWantsText; }
+
+  void Show(const CBitmap& frame) override;
+  void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
+  bool NextEvent(InputEvent& event) override;
+  void WaitEvent(int milliseconds) override;
+  std::int64_t Ticks() override { return m_nTicks; }
+  LocalTime Now() override;
+  void SetTextInput(bool wanted) override { m_bWantsText = wanted; }
+  std::string GetClipboard() override { return m_strClipboard; }
+  void SetClipboard(const std::string& text) override { m_strClipboard = text; }
+  void StartHelpViewer(const std::string& commandLine) override {
+    m_arrHelpCalls.push_back(commandLine);
+  }
+  std::filesystem::path ProfileFolder() override { return m_profileFolder; }
+
+ private:
+  std::filesystem::path m_profileFolder;
+  std::deque<InputEvent> m_arrInput;
+  std::function<bool()> m_onIdle;
+  std::function<void(const CBitmap&)> m_onFrame;
+  std::int64_t m_nTicks = 0;
+  LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
+  std::int64_t m_nClockSetAt = 0;           ///< the ticks then
+  CBitmap m_shown;
+  std::string m_strClipboard;
+  std::vector<std::string> m_arrHelpCalls;
+  bool m_bWantsText = false;
+};
+
+}  // namespace platform

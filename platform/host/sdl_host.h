@@ -1,0 +1,23 @@
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "platform/host/host.h"
+
+namespace platform {
+
+/// What the host must know of the program.
+struct SdlHostOptions {
+  Size frameSize;  ///< of every picture that it is to show, in pixels
+  /// Where the help pages may lie, the first that is there holds; relative to the program's folder.
+  std::vector<std::filesystem::path> helpFolders;
+};
+
+/// A host with a window of the desktop, shown at a whole multiple of its pixels. Null where there
+/// is no display to show a window on; `why` then says what is the matter.
+std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& why);
+
+}  // namespace platform

@@ -1,0 +1,95 @@
+#include "platform/window/application.h"
+
+#include <cstdlib>
+#include <utility>
+
+#include "platform/host/host.h"
+#include "platform/window/document_template.h"
+#include "platform/window/frame_window.h"
+
+namespace platform {
+namespace {
+CApplication* g_pApplication = nullptr;
+}  // namespace
+
+CApplication& TheApp() {
+  if (g_pApplication == nullptr) std::abort();
+  return *g_pApplication;
+}
+
+void Sleep(int milliseconds) { TheApp().Queue().Pause(milliseconds); }
+
+CApplication::CApplication(std::string name, EmbeddedFiles resources, Size windowSize)
+    : m_strName(std::move(name)), m_resources(resources), m_screen(windowSize) {
+  g_pApplication = this;
+}
+
+CApplication::~CApplication() {
+  m_pDocTemplate.reset();
+  g_pApplication = nullptr;
+}
+
+int CApplication::Main() {
+  if (!InitInstance()) return EXIT_FAILURE;
+  RunUntil([] { return false; });
+  return ExitInstance();
+}
+
+void CApplication::RunUntil(const std::function<bool()>& done) {
+  Message message;
+  while (!m_bQuit && !done()) {
+    if (!m_queue.Peek(message)) {
+      OnIdle();
+      m_queue.Wait();
+    } else if (message.kind == MessageKind::kQuit) {
+      m_bQuit = true;
+      m_nExitCode = message.exitCode;
+    } else {
+      Dispatch(message);
+    }
+  }
+}
+
+void CApplication::Dispatch(const Message& message) {
+  switch (message.kind) {
+    case MessageKind::kInput:
+      m_screen.HandleInput(message.input);
+      break;
+    case MessageKind::kCommand:
+      if (m_pMainFrame != nullptr) m_pMainFrame->ExecuteCommand(message.commandID);
+      break;
+    case MessageKind::kClose:
+      m_queue.PostQuit(0);
+      break;
+    case MessageKind::kQuit:
+      break;
+  }
+}
+
+void CApplication::OnIdle() {
+  if (m_pMainFrame != nullptr) m_pMainFrame->RefreshCommandStates();
+  m_screen.PaintAll();
+  m_screen.Present();
+}
+
+void CApplication::SetRegistryKey(const std::string& key) {
+  m_pProfile = std::make_unique<CProfile>(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
+}
+
+void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate) {
+  m_pDocTemplate = std::move(docTemplate);
+}
+
+void CApplication::ShowMainWindow(int iconID) {
+  m_pMainFrame = m_pDocTemplate->Frame();
+  // Desktops scale the icon to their own sizes; a larger one would only cost memory.
+  constexpr int kWindowIconWidth = 48;
+  TheHost().SetIdentity(m_pMainFrame->GetTitle(),
+                        m_resources.LoadIconOfSize(iconID, kWindowIconWidth));
+  m_pMainFrame->Open();
+  OnIdle();
+}
+
+bool CApplication::OpenNewDocument() { return m_pDocTemplate->OpenNewDocument(); }
+
+}  // namespace platform

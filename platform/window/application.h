@@ -1,0 +1,82 @@
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <string>
+
+#include "platform/draw/resources.h"
+#include "platform/store/profile.h"
+#include "platform/window/command.h"
+#include "platform/window/message_queue.h"
+#include "platform/window/screen.h"
+
+namespace platform {
+
+class CFrameWindow;
+class CSingleDocTemplate;
+
+/// The program: its message loop, its screen, its resources and its profile. One object exists for
+/// the life of the process; it is declared after the host.
+class CApplication : public CCommandTarget {
+ public:
+  /// The name is also the one of the settings' file; the window is of that size, in pixels, for as
+  /// long as the program runs.
+  CApplication(std::string name, EmbeddedFiles resources, Size windowSize);
+  ~CApplication() override;
+  CApplication(const CApplication&) = delete;
+  CApplication& operator=(const CApplication&) = delete;
+
+  /// Starts the program, runs it to its end and answers the exit code.
+  int Main();
+
+  /// Also the title of message boxes and the name of the settings' file.
+  const std::string& Name() const { return m_strName; }
+  CMessageQueue& Queue() { return m_queue; }
+  CScreen& Screen() { return m_screen; }
+  CResources& Resources() { return m_resources; }
+  /// The settings' file; SetRegistryKey comes first.
+  const CProfile& Profile() const { return *m_pProfile; }
+  CFrameWindow* MainFrame() const { return m_pMainFrame; }
+
+  /// Handles one message. kQuit is not for here.
+  void Dispatch(const Message& message);
+  /// Runs messages until the condition holds or the program is to end.
+  void RunUntil(const std::function<bool()>& done);
+
+ protected:
+  /// Builds the program's window; false ends the program at once.
+  virtual bool InitInstance() = 0;
+  /// What is to be done at the end; answers the exit code.
+  virtual int ExitInstance() { return m_nExitCode; }
+
+  /// Names the maker under whose folder the settings lie.
+  void SetRegistryKey(const std::string& key);
+  /// The one kind of document that the program has.
+  void AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate);
+  /// Opens a new document, as a start without arguments does; false when that fails.
+  bool OpenNewDocument();
+  /// Puts the document's frame on the screen, with its title and icon, and paints it at once.
+  void ShowMainWindow(int iconID);
+
+ private:
+  void OnIdle();
+
+  std::string m_strName;
+  CResources m_resources;
+  CMessageQueue m_queue;
+  CScreen m_screen;
+  std::unique_ptr<CProfile> m_pProfile;
+  std::unique_ptr<CSingleDocTemplate> m_pDocTemplate;
+  CFrameWindow* m_pMainFrame = nullptr;
+  bool m_bQuit = false;
+  int m_nExitCode = 0;
+};
+
+/// The application object of this process; it must exist.
+CApplication& TheApp();
+
+/// Waits so many milliseconds. What the person does meanwhile is collected in the message queue and
+/// handled later.
+void Sleep(int milliseconds);
+
+}  // namespace platform

@@ -1,0 +1,64 @@
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "platform/window/top_window.h"
+
+namespace platform {
+
+/// A line of a menu; command 0 is a separator.
+struct MenuItem {
+  std::string text;
+  int commandID = 0;
+};
+
+/// A pop-up menu with its title in the command bar.
+struct MenuTemplate {
+  std::string title;
+  std::vector<MenuItem> items;
+};
+
+/// An open menu. A chosen command is posted to the queue; then, or when it is left, the menu
+/// closes.
+class CMenuWindow : public CTopWindow {
+ public:
+  /// The menu opens downwards from a place on the screen. It asks which items are enabled once,
+  /// when it opens.
+  CMenuWindow(const MenuTemplate& menu, Point at, std::function<void()> onClosed);
+
+  /// Highlights the first item, as a menu opened by a key does.
+  void SelectFirst();
+
+  void OnPaint(CSurface& surface) override;
+  void OnLButtonDown(Point p) override { Track(p); }
+  void OnMouseMove(Point p) override { Track(p); }
+  void OnLButtonUp(Point p) override;
+  bool OnKeyDown(const KeyStroke& stroke) override;
+  void OnPressOutside() override { Dismiss(); }
+
+ private:
+  struct Line {
+    MenuItem item;
+    Rect place;
+    bool enabled = false;
+  };
+
+  static Rect PlaceOf(const MenuTemplate& menu, Point at);
+  void DrawLine(CSurface& surface, std::size_t index) const;
+  int LineAt(Point p) const;
+  void Track(Point p) { Select(LineAt(p)); }
+  void Select(int line);
+  void Step(int direction);
+  bool ChooseByLetter(char letter);
+  static bool IsFor(const Line& line, char letter);
+  void Choose(int line);
+  void Dismiss();
+
+  std::vector<Line> m_arrLines;
+  std::function<void()> m_onClosed;
+  int m_nSelected = -1;  ///< the highlighted line; -1: none
+};
+
+}  // namespace platform

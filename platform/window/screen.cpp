@@ -1,0 +1,110 @@
+#include "platform/window/screen.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "platform/host/host.h"
+
+namespace platform {
+
+void CScreen::Push(CTopWindow& window) {
+  LosePress();
+  m_arrWindows.push_back(&window);
+  MarkStale();
+}
+
+void CScreen::Remove(CTopWindow& window) {
+  m_arrWindows.erase(std::remove(m_arrWindows.begin(), m_arrWindows.end(), &window),
+                     m_arrWindows.end());
+  if (m_pPressed != nullptr && &m_pPressed->TopLevel() == &window) m_pPressed = nullptr;
+  MarkStale();
+}
+
+CTopWindow* CScreen::WindowUnder(Point at) const {
+  const auto found =
+      std::find_if(m_arrWindows.rbegin(), m_arrWindows.rend(),
+                   [at](const CTopWindow* window) { return window->GetPlace().Contains(at); });
+  return found == m_arrWindows.rend() ? nullptr : *found;
+}
+
+void CScreen::LosePress() {
+  if (CWindow* pressed = std::exchange(m_pPressed, nullptr); pressed != nullptr) {
+    pressed->OnPressLost();
+  }
+}
+
+void CScreen::PressAt(Point at) {
+  CTopWindow* window = WindowUnder(at);
+  if (Top() != nullptr && Top() != window && Top()->GetKind() == CTopWindow::Kind::kPopup) {
+    Top()->OnPressOutside();
+    return;
+  }
+  if (window == nullptr || !window->IsEnabled()) return;
+  LosePress();
+  CWindow& pressed = window->WindowAt(at - window->GetPlace().TopLeft());
+  m_pPressed = &pressed;
+  pressed.OnLButtonDown(at - pressed.ScreenOrigin());
+}
+
+void CScreen::HandleInput(const InputEvent& event) {
+  CTopWindow* top = Top();
+  switch (event.kind) {
+    case InputKind::kPointerDown:
+      PressAt(event.at);
+      break;
+    case InputKind::kPointerMove:
+      if (m_pPressed != nullptr) m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
+      break;
+    case InputKind::kPointerUp:
+      if (CWindow* pressed = m_pPressed; pressed != nullptr) {
+        m_pPressed = nullptr;
+        pressed->OnLButtonUp(event.at - pressed->ScreenOrigin());
+      }
+      break;
+    case InputKind::kWheel:
+      if (CTopWindow* window = WindowUnder(event.at); window == top && top->IsEnabled()) {
+        window->WindowAt(event.at - window->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
+      }
+      break;
+    case InputKind::kKey:
+      if (top != nullptr && top->IsEnabled()) top->RouteKey(event.stroke);
+      break;
+    case InputKind::kText:
+      if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
+      break;
+    case InputKind::kClose:
+      break;
+  }
+}
+
+void CScreen::PaintAll() {
+  for (CTopWindow* window : m_arrWindows) window->PaintIfNeeded();
+}
+
+void CScreen::Present() {
+  if (!m_bStale || m_arrWindows.empty()) return;
+  m_bStale = false;
+  if (m_arrWindows.size() == 1) {
+    TheHost().Show(Top()->Pixels());
+    return;
+  }
+  CBitmap pixels(m_size);
+  CSurface surface(pixels);
+  for (const CTopWindow* window : m_arrWindows) {
+    surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
+  }
+  TheHost().Show(pixels);
+}
+
+void CScreen::TakePressFrom(const CWindow& window) {
+  for (const CWindow* at = m_pPressed; at != nullptr; at = at->GetParent()) {
+    if (at != &window) continue;
+    return LosePress();
+  }
+}
+
+void CScreen::Forget(CWindow& window) {
+  if (m_pPressed == &window) m_pPressed = nullptr;
+}
+
+}  // namespace platform

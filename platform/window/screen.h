@@ -1,0 +1,50 @@
+#pragma once
+
+#include <vector>
+
+#include "platform/window/top_window.h"
+
+namespace platform {
+
+/// The program's window as a stack of top-level windows, the frame at the bottom. It lays their
+/// pixels over one another and hands input to the right one.
+class CScreen {
+ public:
+  /// A screen of so many pixels; it never changes.
+  explicit CScreen(Size size) : m_size(size) {}
+  Size GetSize() const { return m_size; }
+
+  /// Bottom to top.
+  const std::vector<CTopWindow*>& Windows() const { return m_arrWindows; }
+  CTopWindow* Top() const { return m_arrWindows.empty() ? nullptr : m_arrWindows.back(); }
+  void Push(CTopWindow& window);
+  void Remove(CTopWindow& window);
+
+  void HandleInput(const InputEvent& event);
+  /// Hands the pointer that is down over to another window until it is released.
+  void Capture(CWindow& window) { m_pPressed = &window; }
+
+  /// Something on a top-level window or in the stack has changed.
+  void MarkStale() { m_bStale = true; }
+  void PaintAll();
+  /// Shows the stack if it has changed since it was last shown.
+  void Present();
+
+  /// A window is being disabled or hidden: a press that it or a child of it has is lost.
+  void TakePressFrom(const CWindow& window);
+  /// The window is about to be destroyed.
+  void Forget(CWindow& window);
+
+ private:
+  void PressAt(Point at);
+  /// Whoever has the pointer has it no more, without a release.
+  void LosePress();
+  CTopWindow* WindowUnder(Point at) const;
+
+  Size m_size;
+  std::vector<CTopWindow*> m_arrWindows;
+  bool m_bStale = true;
+  CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
+};
+
+}  // namespace platform

@@ -1,0 +1,53 @@
+#include "platform/window/top_window.h"
+
+#include <utility>
+
+#include "platform/window/application.h"
+
+namespace platform {
+
+CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
+    : CWindow(nullptr, place),
+      m_strTitle(std::move(title)),
+      m_kind(kind),
+      m_pixels({place.Width(), place.Height()}) {}
+
+CTopWindow::~CTopWindow() { Close(); }
+
+void CTopWindow::Open() { TheApp().Screen().Push(*this); }
+
+void CTopWindow::Close() { TheApp().Screen().Remove(*this); }
+
+void CTopWindow::PaintIfNeeded() {
+  if (PaintInto(m_pixels, {}, false)) TheApp().Screen().MarkStale();
+}
+
+void CTopWindow::SetFocus(CWindow* child) {
+  if (m_pFocus == child) return;
+  CWindow* previous = std::exchange(m_pFocus, child);
+  if (previous != nullptr) previous->OnFocus(false);
+  if (m_pFocus != nullptr) m_pFocus->OnFocus(true);
+}
+
+bool CTopWindow::RouteKey(const KeyStroke& stroke) {
+  for (CWindow* window = m_pFocus != nullptr ? m_pFocus : this; window != nullptr;
+       window = window->GetParent()) {
+    if (window->OnKeyDown(stroke)) return true;
+  }
+  return false;
+}
+
+bool CTopWindow::RouteText(const std::string& text) {
+  for (CWindow* window = m_pFocus != nullptr ? m_pFocus : this; window != nullptr;
+       window = window->GetParent()) {
+    if (window->OnChar(text)) return true;
+  }
+  return false;
+}
+
+void CTopWindow::Forget(CWindow& child) {
+  if (m_pFocus == &child) m_pFocus = nullptr;
+  TheApp().Screen().Forget(child);
+}
+
+}  // namespace platform

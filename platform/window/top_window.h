@@ -1,0 +1,53 @@
+#pragma once
+
+#include <string>
+
+#include "platform/window/window.h"
+
+namespace platform {
+
+/// A window of the screen's stack: the frame, a dialog, a menu or a message box. It paints into
+/// pixels of its own; the screen lays them over one another.
+class CTopWindow : public CWindow {
+ public:
+  /// How a press beside the window is taken.
+  enum class Kind {
+    kNormal,  ///< goes to the window that lies there
+    kPopup,   ///< closes this one and does nothing else
+  };
+
+  CTopWindow(std::string title, const Rect& place, Kind kind = Kind::kNormal);
+  ~CTopWindow() override;
+
+  const std::string& GetTitle() const { return m_strTitle; }
+  Kind GetKind() const { return m_kind; }
+  const CBitmap& Pixels() const { return m_pixels; }
+
+  /// Puts the window on top of the stack.
+  void Open();
+  /// Takes it off the stack.
+  void Close();
+
+  void PaintIfNeeded();
+
+  CWindow* GetFocus() const { return m_pFocus; }
+  /// Gives the keyboard to a child; null: to the window itself.
+  void SetFocus(CWindow* child);
+  /// Hands a key to the focused child, then outwards from there; answers whether it meant
+  /// something.
+  bool RouteKey(const KeyStroke& stroke);
+  bool RouteText(const std::string& text);
+
+  /// A press beside a popup.
+  virtual void OnPressOutside() {}
+  /// A child is about to be destroyed.
+  void Forget(CWindow& child);
+
+ private:
+  std::string m_strTitle;
+  Kind m_kind;
+  CBitmap m_pixels;
+  CWindow* m_pFocus = nullptr;
+};
+
+}  // namespace platform
