@@ -28,8 +28,9 @@ void CFeltsideView::OnDeal() {
     DealBlackjack();
   } else if (m_nGameType == kGameVideoPoker) {
     DealVideoPoker();
+  } else {
+    Repaint();
   }
-  Repaint();
 }
 
 void CFeltsideView::Repaint() {
