@@ -3,7 +3,6 @@
 #include <vector>
 
 #include "platform/window/application.h"
-#include "table/command_ids.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -11,12 +10,6 @@ namespace {
 
 constexpr int kDealerStands = 17;
 constexpr int kDealerCards = 5;  ///< the dealer draws no sixth card
-
-bool IsPlayCommand(const platform::Message& message) {
-  if (message.kind != platform::MessageKind::kCommand) return false;
-  return message.commandID == kCommandHit || message.commandID == kCommandStand ||
-         message.commandID == kCommandDoubleDown || message.commandID == kCommandSplit;
-}
 
 /// Whether a message asks to leave the program: that has to wait until the deal is settled.
 bool AsksToLeave(const platform::Message& message) {
@@ -48,8 +41,6 @@ void CFeltsideView::DealerPlay() {
   Settle();
 }
 
-/// Handles what was already waiting when the dealer began. Play commands are dropped; what asks to
-/// leave waits on.
 void CFeltsideView::PumpMessages() {
   platform::CApplication& app = platform::TheApp();
   std::vector<platform::Message> leaving;
@@ -57,7 +48,7 @@ void CFeltsideView::PumpMessages() {
   while (app.Queue().Peek(message)) {
     if (AsksToLeave(message)) {
       leaving.push_back(message);
-    } else if (!IsPlayCommand(message)) {
+    } else {
       app.Dispatch(message);
     }
   }
