@@ -87,10 +87,13 @@ def _draw_ace(card, suit):
 
 def _draw_pips(card, suit, letter):
     colours = SUIT_COLOURS[suit]
-    pip = PIPS[f"{suit} {PIP_SIZES.get(letter, 'small')}"]
+    size = PIP_SIZES.get(letter, "small")
+    pip = PIPS[f"{suit} {size}"]
     turned = [row[::-1] for row in reversed(pip)]
+    # The black suits may have a row more, for the stem; the bodies stand at one height.
+    drop = len(PIPS[f"spades {size}"]) - len(pip)
     mirrored, single = PIP_PLACES.get(f"{letter} of {suit}", PIP_PLACES[letter])
     for x, y in mirrored + single:
-        card.text_grid(x, y, pip, colours)
+        card.text_grid(x, y + drop, pip, colours)
     for x, y in mirrored:
-        card.text_grid(WIDTH - x - len(pip[0]), HEIGHT - y - len(pip), turned, colours)
+        card.text_grid(WIDTH - x - len(pip[0]), HEIGHT - y - drop - len(pip), turned, colours)
