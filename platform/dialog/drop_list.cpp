@@ -78,8 +78,8 @@ void CDropList::Highlight(int item) {
 }
 
 void CDropList::Step(int items) {
-  const int last = static_cast<int>(m_arrItems.size()) - 1;
-  Highlight(std::clamp(m_nHighlighted + items, 0, last));
+  const int count = static_cast<int>(m_arrItems.size());
+  if (count > 0) Highlight(std::clamp(m_nHighlighted + items, 0, count - 1));
 }
 
 void CDropList::Choose() {

@@ -1,6 +1,7 @@
 #include "platform/window/menu_window.h"
 
 #include <algorithm>
+#include <cctype>
 #include <utility>
 
 #include "platform/draw/look.h"
@@ -18,6 +19,11 @@ constexpr int kEdge = 2;
 int HeightOf(const MenuItem& item) { return item.commandID == 0 ? kSeparatorHeight : kLineHeight; }
 
 }  // namespace
+
+char LetterOf(const std::string& itemText) {
+  if (const char marked = MnemonicOf(itemText); marked != 0 || itemText.empty()) return marked;
+  return static_cast<char>(std::toupper(static_cast<unsigned char>(itemText[0])));
+}
 
 Rect CMenuWindow::PlaceOf(const MenuTemplate& menu, Point at) {
   Size size{0, 2 * kEdge};
@@ -123,19 +129,13 @@ bool CMenuWindow::ChooseByLetter(char letter) {
   std::vector<int> matches;
   for (int i = 1; i <= count; ++i) {
     const int line = (m_nSelected + i + count) % count;
-    if (IsFor(m_arrLines[static_cast<std::size_t>(line)], letter)) matches.push_back(line);
+    const Line& at = m_arrLines[static_cast<std::size_t>(line)];
+    if (letter != 0 && at.enabled && LetterOf(at.item.text) == letter) matches.push_back(line);
   }
   if (matches.empty()) return false;
   Select(matches.front());
   if (matches.size() == 1) Choose(matches.front());
   return true;
-}
-
-/// A letter stands for an enabled item that marks it, or that marks none and begins with it.
-bool CMenuWindow::IsFor(const Line& line, char letter) {
-  if (letter == 0 || !line.enabled || line.item.text.empty()) return false;
-  const char mnemonic = MnemonicOf(line.item.text);
-  return letter == (mnemonic != 0 ? mnemonic : line.item.text[0]);
 }
 
 void CMenuWindow::Choose(int line) {

@@ -20,6 +20,10 @@ struct MenuTemplate {
   std::vector<MenuItem> items;
 };
 
+/// The letter that stands for an item, as a capital: the marked one, else the first; 0 for an empty
+/// text.
+char LetterOf(const std::string& itemText);
+
 /// An open menu. A chosen command is posted to the queue; then, or when it is left, the menu
 /// closes.
 class CMenuWindow : public CTopWindow {
@@ -52,7 +56,6 @@ class CMenuWindow : public CTopWindow {
   void Select(int line);
   void Step(int direction);
   bool ChooseByLetter(char letter);
-  static bool IsFor(const Line& line, char letter);
   void Choose(int line);
   void Dismiss();
 

@@ -62,8 +62,8 @@ void CScreen::HandleInput(const InputEvent& event) {
       }
       break;
     case InputKind::kWheel:
-      if (CTopWindow* window = WindowUnder(event.at); window == top && top->IsEnabled()) {
-        window->WindowAt(event.at - window->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
+      if (top != nullptr && top == WindowUnder(event.at) && top->IsEnabled()) {
+        top->WindowAt(event.at - top->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
       }
       break;
     case InputKind::kKey:
@@ -84,10 +84,9 @@ void CScreen::PaintAll() {
 void CScreen::Present() {
   if (!m_bStale || m_arrWindows.empty()) return;
   m_bStale = false;
-  if (m_arrWindows.size() == 1) {
-    TheHost().Show(Top()->Pixels());
-    return;
-  }
+  const CBitmap& whole = Top()->Pixels();
+  // The frame alone needs no other picture than its own.
+  if (m_arrWindows.size() == 1 && whole.GetSize() == m_size) return TheHost().Show(whole);
   CBitmap pixels(m_size);
   CSurface surface(pixels);
   for (const CTopWindow* window : m_arrWindows) {
