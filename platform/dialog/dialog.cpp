@@ -235,7 +235,7 @@ void CDialog::DrawCaption(CSurface& surface) const {
 }
 
 void CDialog::OnLButtonDown(Point p) {
-  m_grip = p;
+  m_ptGrip = p;
   m_rcPressed = CloseButton().Contains(p)  ? CloseButton()
                 : HelpButton().Contains(p) ? HelpButton()
                                            : Rect{};
@@ -245,7 +245,7 @@ void CDialog::OnLButtonDown(Point p) {
 }
 
 void CDialog::OnMouseMove(Point p) {
-  if (m_bMoving) MoveBy(p - m_grip);
+  if (m_bMoving) MoveBy(p - m_ptGrip);
   if (m_bInside == m_rcPressed.Contains(p)) return;
   m_bInside = !m_bInside;
   Invalidate();

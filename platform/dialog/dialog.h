@@ -24,7 +24,7 @@ class CDialog : public CTopWindow {
   explicit CDialog(const DialogTemplate& form);
   ~CDialog() override;
 
-  /// Runs the dialog and answers how it was ended. When the program is to end meanwhile, it is
+  /// Runs the dialog and returns how it was ended. When the program is to end meanwhile, it is
   /// cancelled.
   int DoModal();
   void EndDialog(int result);
@@ -91,7 +91,7 @@ class CDialog : public CTopWindow {
   bool m_bEnded = false;
   int m_nResult = kResultCancel;
   bool m_bMoving = false;
-  Point m_grip;            ///< where the caption was taken
+  Point m_ptGrip;          ///< where the caption was taken
   Rect m_rcPressed;        ///< the caption's button that the stylus went down on; empty: none
   bool m_bInside = false;  ///< still on it
 };

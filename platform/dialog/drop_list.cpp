@@ -37,7 +37,7 @@ CDropList::CDropList(const std::vector<std::string>& items, int chosen, const Re
     : CTopWindow("", PlaceFor(items.size(), line), Kind::kPopup),
       m_arrItems(items),
       m_nHighlighted(chosen),
-      m_onChosen(std::move(onChosen)) {}
+      m_fnChosen(std::move(onChosen)) {}
 
 void CDropList::OnPaint(CSurface& surface) {
   surface.SetPen(kBlack);
@@ -84,7 +84,7 @@ void CDropList::Step(int items) {
 
 void CDropList::Choose() {
   Close();
-  if (m_nHighlighted >= 0) m_onChosen(m_nHighlighted);
+  if (m_nHighlighted >= 0) m_fnChosen(m_nHighlighted);
 }
 
 bool CDropList::OnKeyDown(const KeyStroke& stroke) {

@@ -36,7 +36,7 @@ class CDropList : public CTopWindow {
 
   std::vector<std::string> m_arrItems;
   int m_nHighlighted;
-  std::function<void(int item)> m_onChosen;
+  std::function<void(int item)> m_fnChosen;
 };
 
 }  // namespace platform

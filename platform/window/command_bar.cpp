@@ -126,21 +126,21 @@ void CCommandBar::DrawClose(CSurface& surface) const {
 /// The place that shows pressed; an empty one where nothing does.
 Rect CCommandBar::PressedPlace() const {
   if (!m_bStylusInside) return {};
-  if (m_pressed == Part::kClose) return m_rcClose;
-  return m_pressed == Part::kButton ? m_arrButtons[m_nPressedButton].place : Rect{};
+  if (m_ePressed == Part::kClose) return m_rcClose;
+  return m_ePressed == Part::kButton ? m_arrButtons[m_nPressedButton].place : Rect{};
 }
 
 void CCommandBar::OnLButtonDown(Point p) {
-  m_pressed = Part::kNone;
+  m_ePressed = Part::kNone;
   if (m_rcTitle.Contains(p)) {
     OpenMenu();
     TheApp().Screen().Capture(*m_pMenu);
     return;
   }
-  if (m_rcClose.Contains(p)) m_pressed = Part::kClose;
+  if (m_rcClose.Contains(p)) m_ePressed = Part::kClose;
   for (std::size_t i = 0; i < m_arrButtons.size(); ++i) {
     if (m_arrButtons[i].place.Contains(p) && m_arrButtons[i].enabled) {
-      m_pressed = Part::kButton;
+      m_ePressed = Part::kButton;
       m_nPressedButton = i;
     }
   }
@@ -149,23 +149,23 @@ void CCommandBar::OnLButtonDown(Point p) {
 }
 
 void CCommandBar::OnMouseMove(Point p) {
-  const Rect place = m_pressed == Part::kClose    ? m_rcClose
-                     : m_pressed == Part::kButton ? m_arrButtons[m_nPressedButton].place
-                                                  : Rect{};
+  const Rect place = m_ePressed == Part::kClose    ? m_rcClose
+                     : m_ePressed == Part::kButton ? m_arrButtons[m_nPressedButton].place
+                                                   : Rect{};
   if (m_bStylusInside == place.Contains(p)) return;
   m_bStylusInside = place.Contains(p);
   Invalidate();
 }
 
 void CCommandBar::OnPressLost() {
-  m_pressed = Part::kNone;
+  m_ePressed = Part::kNone;
   m_bStylusInside = false;
   Invalidate();
 }
 
 void CCommandBar::OnLButtonUp(Point p) {
   OnMouseMove(p);
-  const Part released = m_bStylusInside ? m_pressed : Part::kNone;
+  const Part released = m_bStylusInside ? m_ePressed : Part::kNone;
   OnPressLost();
   if (released == Part::kClose) TheApp().Queue().Post({MessageKind::kClose, {}, 0, 0});
   if (released == Part::kButton) {

@@ -59,7 +59,7 @@ class CCommandBar : public CWindow {
   std::vector<int> m_arrSeparators;  ///< x of each
   std::unique_ptr<CMenuWindow> m_pMenu;
   bool m_bMenuOpen = false;
-  Part m_pressed = Part::kNone;
+  Part m_ePressed = Part::kNone;
   std::size_t m_nPressedButton = 0;
   bool m_bStylusInside = false;  ///< still on what it went down on
 };

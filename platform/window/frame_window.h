@@ -38,7 +38,7 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
 
   /// Whether a command may run now, asked afresh.
   bool IsCommandEnabled(int commandID);
-  /// Asks and, if it may, runs a command; answers whether it ran.
+  /// Asks and, if it may, runs a command; returns whether it ran.
   bool ExecuteCommand(int commandID);
   /// Has the tool bar show which commands may run.
   virtual void RefreshCommandStates() {}

@@ -37,7 +37,7 @@ Rect CMenuWindow::PlaceOf(const MenuTemplate& menu, Point at) {
 
 CMenuWindow::CMenuWindow(const MenuTemplate& menu, Point at, std::function<void()> onClosed)
     : CTopWindow(WithoutMnemonic(menu.title), PlaceOf(menu, at), Kind::kPopup),
-      m_onClosed(std::move(onClosed)) {
+      m_fnClosed(std::move(onClosed)) {
   int y = kEdge;
   for (const MenuItem& item : menu.items) {
     const Rect place{kEdge, y, GetPlace().Width() - kEdge, y + HeightOf(item)};
@@ -147,7 +147,7 @@ void CMenuWindow::Choose(int line) {
 
 void CMenuWindow::Dismiss() {
   Close();
-  m_onClosed();
+  m_fnClosed();
 }
 
 }  // namespace platform

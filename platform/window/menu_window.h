@@ -60,7 +60,7 @@ class CMenuWindow : public CTopWindow {
   void Dismiss();
 
   std::vector<Line> m_arrLines;
-  std::function<void()> m_onClosed;
+  std::function<void()> m_fnClosed;
   int m_nSelected = -1;  ///< the highlighted line; -1: none
 };
 

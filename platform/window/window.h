@@ -49,7 +49,7 @@ class CWindow {
   /// The visible, enabled window under a place: a child, a child's child, or this one.
   CWindow& WindowAt(Point p);
 
-  /// Paints the background and answers true; false leaves it to the common face.
+  /// Paints the background and returns true; false leaves it to the common face.
   virtual bool OnEraseBkgnd(CSurface&) { return false; }
   virtual void OnPaint(CSurface&) {}
   virtual void OnLButtonDown(Point) {}
@@ -68,7 +68,7 @@ class CWindow {
 
  private:
   friend class CTopWindow;
-  /// Paints itself and its children where needed onto the top-level window's pixels; answers
+  /// Paints itself and its children where needed onto the top-level window's pixels; returns
   /// whether anything was.
   bool PaintInto(CBitmap& pixels, Point origin, bool force);
 

@@ -46,7 +46,8 @@ TEST(Screen, IsShownWholeWithASmallWindowAlone) {
 
 class OneList : public platform::CDialog {
  public:
-  OneList() : CDialog({"", 100, 100, {{platform::ControlKind::kComboBox, 7, "", {5, 5, 90, 60}}}}) {}
+  OneList()
+      : CDialog({"", 100, 100, {{platform::ControlKind::kComboBox, 7, "", {5, 5, 90, 60}}}}) {}
   void OnSelChange(int) override { ADD_FAILURE(); }
 };
 
