@@ -14,8 +14,8 @@ inline constexpr int kResultOk = 1;
 inline constexpr int kResultCancel = 2;
 
 /// A window that is worked with until it is closed, while everything beneath it is dead. It is
-/// built from a template, moved by its caption, always wholly on the screen, and closed by its
-/// buttons, by Escape or by the cross in its caption.
+/// built from a template, moved by its caption, off the screen but for a grip of it, and closed by
+/// its buttons, by Escape or by the cross in its caption.
 ///
 /// Keys: Tab and Shift+Tab go from control to control, Enter pushes the default button, a control's
 /// marked letter (with Alt, or alone where no text is typed) activates it, F1 asks for help.

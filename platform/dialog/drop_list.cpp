@@ -27,8 +27,8 @@ int NextItemByLetter(const std::vector<std::string>& items, int from, char lette
 
 Rect CDropList::PlaceFor(std::size_t items, const Rect& line) {
   const int height = static_cast<int>(items) * kRowHeight + 2;
-  const bool fitsBelow = line.bottom + height <= TheApp().Screen().GetSize().height;
-  const int top = fitsBelow ? line.bottom : std::max(0, line.top - height);
+  const int room = std::max(0, TheApp().Screen().GetSize().height - height);
+  const int top = line.bottom <= room ? line.bottom : std::clamp(line.top - height, 0, room);
   return {line.left, top, line.right, top + height};
 }
 
@@ -70,6 +70,11 @@ void CDropList::OnLButtonUp(Point p) {
     Highlight(item);
     Choose();
   }
+}
+
+/// A mouse that stays on an item leaves the highlight to the keys.
+void CDropList::OnMouseHover(Point p) {
+  if (const int item = ItemAt(p); std::exchange(m_nHovered, item) != item) OnMouseMove(p);
 }
 
 void CDropList::Highlight(int item) {

@@ -100,6 +100,11 @@ void CMenuWindow::OnLButtonUp(Point p) {
   if (const int line = LineAt(p); line >= 0) Choose(line);
 }
 
+/// A mouse that stays on a line leaves the highlight to the keys.
+void CMenuWindow::OnMouseHover(Point p) {
+  if (const int line = LineAt(p); std::exchange(m_nHovered, line) != line) Select(line);
+}
+
 bool CMenuWindow::OnKeyDown(const KeyStroke& stroke) {
   switch (stroke.key) {
     case Key::kUp:

@@ -39,6 +39,7 @@ class CMenuWindow : public CTopWindow {
   void OnLButtonDown(Point p) override { Track(p); }
   void OnMouseMove(Point p) override { Track(p); }
   void OnLButtonUp(Point p) override;
+  void OnMouseHover(Point p) override;
   bool OnKeyDown(const KeyStroke& stroke) override;
   void OnPressOutside() override { Dismiss(); }
 
@@ -62,6 +63,7 @@ class CMenuWindow : public CTopWindow {
   std::vector<Line> m_arrLines;
   std::function<void()> m_fnClosed;
   int m_nSelected = -1;  ///< the highlighted line; -1: none
+  int m_nHovered = -1;   ///< the line under the mouse; -1: none
 };
 
 }  // namespace platform

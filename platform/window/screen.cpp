@@ -46,6 +46,12 @@ void CScreen::PressAt(Point at) {
   pressed.OnLButtonDown(at - pressed.ScreenOrigin());
 }
 
+void CScreen::HoverAt(Point at) {
+  if (Top() == nullptr || !Top()->IsEnabled()) return;
+  CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
+  window.OnMouseHover(at - window.ScreenOrigin());
+}
+
 void CScreen::HandleInput(const InputEvent& event) {
   CTopWindow* top = Top();
   switch (event.kind) {
@@ -53,7 +59,11 @@ void CScreen::HandleInput(const InputEvent& event) {
       PressAt(event.at);
       break;
     case InputKind::kPointerMove:
-      if (m_pPressed != nullptr) m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
+      if (m_pPressed == nullptr) {
+        HoverAt(event.at);
+      } else {
+        m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
+      }
       break;
     case InputKind::kPointerUp:
       if (CWindow* pressed = m_pPressed; pressed != nullptr) {

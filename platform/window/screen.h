@@ -37,6 +37,7 @@ class CScreen {
 
  private:
   void PressAt(Point at);
+  void HoverAt(Point at);
   /// Whoever has the pointer has it no more, without a release.
   void LosePress();
   CTopWindow* WindowUnder(Point at) const;

@@ -56,6 +56,8 @@ class CWindow {
   /// While the button or stylus that went down in this window is down; may lie outside of it.
   virtual void OnMouseMove(Point) {}
   virtual void OnLButtonUp(Point) {}
+  /// While a mouse moves with nothing down, in the topmost window; beside it too.
+  virtual void OnMouseHover(Point) {}
   /// The press that this window had is over without a release: it was disabled or hidden meanwhile,
   /// or another window opened.
   virtual void OnPressLost() {}
