@@ -31,8 +31,8 @@ bool AsksToLeave(const platform::Message& message) {
 void CFeltsideView::DealerPlay() {
   m_bHandInProgress = 0;
   m_strDealerScore = std::to_string(m_handDealer.GetTotal());
-  // None of what arrives may touch the deal being settled: the disabled frame refuses taps, keys
-  // and commands, and shows its buttons grey.
+  // None of what arrives may touch the deal being settled: the disabled frame refuses commands, and
+  // shows its menu and buttons grey.
   TopLevel().EnableWindow(false);
   platform::TheApp().MainFrame()->RefreshCommandStates();
   PumpMessages();
@@ -48,20 +48,20 @@ void CFeltsideView::DealerPlay() {
   Settle();
 }
 
-/// Handles what was already waiting when the dealer began. Play commands are dropped; what asks to
-/// leave waits on.
+/// Clears away the commands that were already waiting when the dealer began. Taps, and what asks to
+/// leave, wait on for the end of the deal, as those do that come in a pause.
 void CFeltsideView::PumpMessages() {
   platform::CApplication& app = platform::TheApp();
-  std::vector<platform::Message> leaving;
+  std::vector<platform::Message> later;
   platform::Message message;
   while (app.Queue().Peek(message)) {
-    if (AsksToLeave(message)) {
-      leaving.push_back(message);
+    if (message.kind == platform::MessageKind::kInput || AsksToLeave(message)) {
+      later.push_back(message);
     } else if (!IsPlayCommand(message)) {
       app.Dispatch(message);
     }
   }
-  for (const platform::Message& waiting : leaving) app.Queue().Post(waiting);
+  for (const platform::Message& waiting : later) app.Queue().Post(waiting);
 }
 
 void CFeltsideView::Settle() {

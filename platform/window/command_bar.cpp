@@ -1,6 +1,7 @@
 #include "platform/window/command_bar.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/draw/look.h"
 #include "platform/window/application.h"
@@ -60,11 +61,13 @@ void CCommandBar::LoadToolBar(const ToolBarTemplate& toolBar) {
 }
 
 void CCommandBar::RefreshStates() {
+  if (const bool enabled = TopLevel().IsEnabled();
+      std::exchange(m_bMenuEnabled, enabled) != enabled) {
+    Invalidate();
+  }
   for (Button& button : m_arrButtons) {
     const bool enabled = TheApp().MainFrame()->IsCommandEnabled(button.commandID);
-    if (button.enabled == enabled) continue;
-    button.enabled = enabled;
-    Invalidate();
+    if (std::exchange(button.enabled, enabled) != enabled) Invalidate();
   }
 }
 
@@ -99,8 +102,8 @@ void CCommandBar::OnPaint(CSurface& surface) {
 void CCommandBar::DrawTitle(CSurface& surface) const {
   if (m_bMenuOpen) surface.FillRect(m_rcTitle, kHighlight);
   const int y = m_rcTitle.top + (m_rcTitle.Height() - kSystemFont.height) / 2;
-  DrawMnemonicText(surface, {m_rcTitle.left + kTitlePadding, y}, m_menu.title,
-                   m_bMenuOpen ? kWhite : kBlack);
+  const Color color = m_bMenuOpen ? kWhite : m_bMenuEnabled ? kBlack : kDisabledText;
+  DrawMnemonicText(surface, {m_rcTitle.left + kTitlePadding, y}, m_menu.title, color);
 }
 
 void CCommandBar::DrawTools(CSurface& surface) const {
@@ -132,7 +135,7 @@ Rect CCommandBar::PressedPlace() const {
 
 void CCommandBar::OnLButtonDown(Point p) {
   m_ePressed = Part::kNone;
-  if (m_rcTitle.Contains(p)) {
+  if (m_rcTitle.Contains(p) && m_bMenuEnabled) {
     OpenMenu();
     TheApp().Screen().Capture(*m_pMenu);
     return;

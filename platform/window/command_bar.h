@@ -25,7 +25,8 @@ class CCommandBar : public CWindow {
   void AddAdornments();
   void LoadToolBar(const ToolBarTemplate& toolBar);
 
-  /// Asks for each button whether its command may run, and shows it.
+  /// Asks for each button whether its command may run, and for the menu whether any may, and shows
+  /// it. What is shown grey is dead until it is asked again.
   void RefreshStates();
   /// Opens the menu when the key is F10 or Alt with the letter of its title.
   bool OpenMenuByKey(const KeyStroke& stroke);
@@ -59,6 +60,7 @@ class CCommandBar : public CWindow {
   std::vector<int> m_arrSeparators;  ///< x of each
   std::unique_ptr<CMenuWindow> m_pMenu;
   bool m_bMenuOpen = false;
+  bool m_bMenuEnabled = false;
   Part m_ePressed = Part::kNone;
   std::size_t m_nPressedButton = 0;
   bool m_bStylusInside = false;  ///< still on what it went down on
