@@ -40,6 +40,8 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
   bool IsCommandEnabled(int commandID);
   /// Asks and, if it may, runs a command; returns whether it ran.
   bool ExecuteCommand(int commandID);
+  /// The key that stands for a command, as a person reads it; empty for none.
+  std::string KeyOf(int commandID) const;
   /// Has the tool bar show which commands may run.
   virtual void RefreshCommandStates() {}
 

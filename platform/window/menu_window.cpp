@@ -15,8 +15,15 @@ constexpr int kLineHeight = 20;
 constexpr int kSeparatorHeight = 7;
 constexpr int kIndent = 12;
 constexpr int kEdge = 2;
+constexpr int kKeyGap = 24;  ///< at least, between an item and its key
 
 int HeightOf(const MenuItem& item) { return item.commandID == 0 ? kSeparatorHeight : kLineHeight; }
+
+int WidthOf(const MenuItem& item) {
+  const int width = MeasureText(kSystemFont, WithoutMnemonic(item.text)).width;
+  const std::string key = TheApp().MainFrame()->KeyOf(item.commandID);
+  return key.empty() ? width : width + kKeyGap + MeasureText(kSystemFont, key).width;
+}
 
 }  // namespace
 
@@ -28,8 +35,7 @@ char LetterOf(const std::string& itemText) {
 Rect CMenuWindow::PlaceOf(const MenuTemplate& menu, Point at) {
   Size size{0, 2 * kEdge};
   for (const MenuItem& item : menu.items) {
-    const int width = MeasureText(kSystemFont, WithoutMnemonic(item.text)).width;
-    size.width = std::max(size.width, width + 2 * (kIndent + kEdge));
+    size.width = std::max(size.width, WidthOf(item) + 2 * (kIndent + kEdge));
     size.height += HeightOf(item);
   }
   return RectAt(at, size);
@@ -41,8 +47,9 @@ CMenuWindow::CMenuWindow(const MenuTemplate& menu, Point at, std::function<void(
   int y = kEdge;
   for (const MenuItem& item : menu.items) {
     const Rect place{kEdge, y, GetPlace().Width() - kEdge, y + HeightOf(item)};
-    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(item.commandID);
-    m_arrLines.push_back({item, place, enabled});
+    CFrameWindow& frame = *TheApp().MainFrame();
+    m_arrLines.push_back(
+        {item, frame.KeyOf(item.commandID), place, frame.IsCommandEnabled(item.commandID)});
     y = place.bottom;
   }
 }
@@ -65,6 +72,8 @@ void CMenuWindow::DrawLine(CSurface& surface, std::size_t index) const {
   const Color color = !line.enabled ? kDisabledText : selected ? kWhite : kBlack;
   const int y = line.place.top + (kLineHeight - kSystemFont.height) / 2;
   DrawMnemonicText(surface, {line.place.left + kIndent, y}, line.item.text, color);
+  const int keyWidth = MeasureText(kSystemFont, line.key).width;
+  DrawMnemonicText(surface, {line.place.right - kIndent - keyWidth, y}, line.key, color);
 }
 
 int CMenuWindow::LineAt(Point p) const {

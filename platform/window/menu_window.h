@@ -24,7 +24,7 @@ struct MenuTemplate {
 /// text.
 char LetterOf(const std::string& itemText);
 
-/// An open menu. A chosen command is posted to the queue; then, or when it is left, the menu
+/// An open menu; at its right edge stand the keys that its items have. A chosen command is posted to the queue; then, or when it is left, the menu
 /// closes.
 class CMenuWindow : public CTopWindow {
  public:
@@ -46,6 +46,7 @@ class CMenuWindow : public CTopWindow {
  private:
   struct Line {
     MenuItem item;
+    std::string key;
     Rect place;
     bool enabled = false;
   };

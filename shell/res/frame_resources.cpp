@@ -28,13 +28,12 @@ platform::ToolBarTemplate MainToolBar() {
 
 std::vector<platform::Accelerator> MainAccelerators() {
   const auto ctrl = [](char letter) {
-    platform::KeyStroke stroke;
-    stroke.key = platform::Key::kCharacter;
-    stroke.character = letter;
-    stroke.ctrl = true;
-    return stroke;
+    return platform::KeyStroke{.key = platform::Key::kCharacter, .character = letter, .ctrl = true};
   };
-  return {{ctrl('N'), platform::kCommandNew}, {ctrl('O'), platform::kCommandOpen}};
+  return {{ctrl('N'), platform::kCommandNew},
+          {ctrl('O'), platform::kCommandOpen},
+          {ctrl('Q'), platform::kCommandExit},
+          {{.key = platform::Key::kF1}, kCommandHelp}};
 }
 
 }  // namespace feltside

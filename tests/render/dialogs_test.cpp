@@ -31,8 +31,9 @@ const std::string kFive =
 const std::string kLongName = "type A name that is longer than a line of the list";
 const std::string kRich = "wallet 250";
 const std::string kExit = "command 57665";
-const Texts kMenu = {"&BlackJack", "&Game Setup", "&Table Setup ", "High Scores",
-                     "&About...",  "Help...",     "E&xit"};
+const Texts kMenu = {"&BlackJack",  "&Game Setup", "&Table Setup ",
+                     "High Scores", "&About...",   "Help...",
+                     "E&xit",       "F1",          "Ctrl+Q"};
 const Texts kBacks = {"Blue",          "Black",          "Purple",    "Smiley",
                       "Dirty Yellow ", "Skull",          "Blue Star", "Purple Star",
                       "Metal Rivet",   "Red Pinstripes", "Wild",      "Blue Pinstripes"};
