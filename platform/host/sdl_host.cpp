@@ -24,6 +24,13 @@ bool IsChordHeld() {
   return (held & (KMOD_RALT | KMOD_MODE)) == 0 && (held & (KMOD_CTRL | KMOD_LALT)) != 0;
 }
 
+/// A text that SDL hands over, which may be none.
+std::string TakeText(char* text) {
+  std::string copy = text == nullptr ? "" : text;
+  SDL_free(text);
+  return copy;
+}
+
 /// SDL's subsystems for as long as the host lives.
 class SdlVideo {
  public:
@@ -32,6 +39,8 @@ class SdlVideo {
     SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
     // Nor to take the desktop's effects away from all other windows.
     SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
+    SDL_SetHint(SDL_HINT_IME_SUPPORT_EXTENDED_TEXT, "1");
+    SDL_SetHint(SDL_HINT_IME_SHOW_UI, "1");
     m_bReady = SDL_Init(SDL_INIT_VIDEO) == 0;
   }
   ~SdlVideo() { SDL_Quit(); }
@@ -64,6 +73,8 @@ class SdlHost : public Host {
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override {
     m_window.SetIdentity(title, icon);
   }
+  void SetWindowPlace(const WindowPlace& place) override { m_window.SetPlace(place); }
+  std::optional<WindowPlace> GetWindowPlace() override { return m_window.GetPlace(); }
 
   bool NextEvent(InputEvent& event) override {
     SDL_Event raw;
@@ -90,24 +101,18 @@ class SdlHost : public Host {
             local->tm_hour,        local->tm_min,     local->tm_sec};
   }
 
-  void SetTextInput(bool wanted) override {
-    if (wanted) {
-      SDL_StartTextInput();
-    } else {
-      SDL_StopTextInput();
-    }
+  void SetTextInput(const std::optional<Rect>& place) override {
+    if (!place) return SDL_StopTextInput();
+    const SDL_Rect rect = m_window.WindowRect(*place);
+    SDL_SetTextInputRect(&rect);
+    SDL_StartTextInput();
   }
 
-  std::string GetClipboard() override {
-    char* text = SDL_GetClipboardText();
-    std::string copy = text == nullptr ? "" : text;
-    SDL_free(text);
-    return copy;
-  }
+  std::string GetClipboard() override { return TakeText(SDL_GetClipboardText()); }
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
-  void StartHelpViewer(const std::string& commandLine) override {
-    platform::StartHelpViewer(m_arrHelpFolders, commandLine);
+  bool StartHelpViewer(const std::string& commandLine) override {
+    return platform::StartHelpViewer(m_arrHelpFolders, commandLine);
   }
 
   std::filesystem::path ProfileFolder() override { return DefaultProfileFolder(); }
@@ -116,6 +121,7 @@ class SdlHost : public Host {
   /// Answers whether the event is one for the program; those for the window alone are done here.
   bool Translate(const SDL_Event& raw, InputEvent& event);
   bool TranslatePointer(InputKind kind, Uint8 button, int x, int y, InputEvent& event) const;
+  bool TranslateMiddleClick(const SDL_MouseButtonEvent& button, InputEvent& event) const;
   bool TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event);
 
   std::unique_ptr<SdlVideo> m_pVideo;
@@ -131,8 +137,10 @@ bool SdlHost::Translate(const SDL_Event& raw, InputEvent& event) {
       return true;
     case SDL_WINDOWEVENT:
       m_window.Refresh();
-      return false;
+      event.kind = InputKind::kPointerLeave;
+      return raw.window.event == SDL_WINDOWEVENT_LEAVE;
     case SDL_MOUSEBUTTONDOWN:
+      if (raw.button.button == SDL_BUTTON_MIDDLE) return TranslateMiddleClick(raw.button, event);
       return TranslatePointer(InputKind::kPointerDown, raw.button.button, raw.button.x,
                               raw.button.y, event);
     case SDL_MOUSEBUTTONUP:
@@ -152,6 +160,14 @@ bool SdlHost::Translate(const SDL_Event& raw, InputEvent& event) {
       event.kind = InputKind::kText;
       event.text = raw.text.text;
       return !IsChordHeld();
+    case SDL_TEXTEDITING:
+      event.kind = InputKind::kComposition;
+      event.text = raw.edit.text;
+      return true;
+    case SDL_TEXTEDITING_EXT:
+      event.kind = InputKind::kComposition;
+      event.text = TakeText(raw.editExt.text);
+      return true;
     default:
       return false;
   }
@@ -162,6 +178,13 @@ bool SdlHost::TranslatePointer(InputKind kind, Uint8 button, int x, int y,
   if (button != SDL_BUTTON_LEFT) return false;
   event.kind = kind;
   event.at = m_window.FramePoint(x, y);
+  return true;
+}
+
+bool SdlHost::TranslateMiddleClick(const SDL_MouseButtonEvent& button, InputEvent& event) const {
+  event.kind = InputKind::kMiddleClick;
+  event.at = m_window.FramePoint(button.x, button.y);
+  event.text = TakeText(SDL_GetPrimarySelectionText());
   return true;
 }
 

@@ -81,6 +81,20 @@ void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitma
   if (icon) SetIcon(m_pWindow, *icon);
 }
 
+void SdlWindow::SetPlace(const WindowPlace& place) {
+  SDL_SetWindowPosition(m_pWindow, place.rect.left, place.rect.top);
+  SDL_SetWindowSize(m_pWindow, place.rect.Width(), place.rect.Height());
+  if (place.maximized) SDL_MaximizeWindow(m_pWindow);
+}
+
+WindowPlace SdlWindow::GetPlace() const {
+  Point at;
+  Size size;
+  SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
+  SDL_GetWindowSize(m_pWindow, &size.width, &size.height);
+  return {RectAt(at, size), (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_MAXIMIZED) != 0};
+}
+
 void SdlWindow::Show(const CBitmap& frame) {
   SDL_UpdateTexture(m_pTexture, nullptr, frame.Pixels().data(), m_frameSize.width * 4);
   if (!m_bShown) SDL_ShowWindow(m_pWindow);
@@ -123,6 +137,19 @@ Point SdlWindow::FramePoint(int x, int y) const {
   const int across = x * room.width / std::max(1, window.width) - place.x;
   const int down = y * room.height / std::max(1, window.height) - place.y;
   return {FloorDivide(across, multiple), FloorDivide(down, multiple)};
+}
+
+SDL_Rect SdlWindow::WindowRect(const Rect& pixels) const {
+  Size window{1, 1};
+  Size room{1, 1};
+  SDL_GetWindowSize(m_pWindow, &window.width, &window.height);
+  SDL_GetRendererOutputSize(m_pRenderer, &room.width, &room.height);
+  const SDL_Rect place = FramePlace();
+  const int multiple = place.w / m_frameSize.width;
+  const auto across = [&](int x) { return (place.x + x * multiple) * window.width / room.width; };
+  const auto down = [&](int y) { return (place.y + y * multiple) * window.height / room.height; };
+  return {across(pixels.left), down(pixels.top), across(pixels.right) - across(pixels.left),
+          down(pixels.bottom) - down(pixels.top)};
 }
 
 }  // namespace platform

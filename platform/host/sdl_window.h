@@ -6,6 +6,7 @@
 #include <string>
 
 #include "platform/draw/bitmap.h"
+#include "platform/host/window_place.h"
 
 namespace platform {
 
@@ -21,12 +22,17 @@ class SdlWindow {
   /// Whether there is something to draw on.
   bool IsOpen() const { return m_pTexture != nullptr; }
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon);
+  /// Before the first picture is shown.
+  void SetPlace(const WindowPlace& place);
+  WindowPlace GetPlace() const;
   void Show(const CBitmap& frame);
   /// Shows the last picture again.
   void Refresh();
   void ToggleFullScreen();
   /// The pixel of the picture under a place in window coordinates; may lie beside the picture.
   Point FramePoint(int x, int y) const;
+  /// Pixels of the picture in window coordinates.
+  SDL_Rect WindowRect(const Rect& pixels) const;
 
  private:
   bool Open(bool plain);

@@ -82,6 +82,9 @@ void CScreen::HandleInput(const InputEvent& event) {
     case InputKind::kText:
       if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
       break;
+    case InputKind::kPointerLeave:
+    case InputKind::kMiddleClick:
+    case InputKind::kComposition:
     case InputKind::kClose:
       break;
   }
