@@ -3,7 +3,6 @@
 #include <vector>
 
 #include "platform/window/application.h"
-#include "table/command_ids.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -12,18 +11,11 @@ namespace {
 constexpr int kDealerStands = 17;
 constexpr int kDealerCards = 5;  ///< the dealer draws no sixth card
 
-bool IsPlayCommand(const platform::Message& message) {
-  if (message.kind != platform::MessageKind::kCommand) return false;
-  return message.commandID == kCommandHit || message.commandID == kCommandStand ||
-         message.commandID == kCommandDoubleDown || message.commandID == kCommandSplit;
-}
-
-/// Whether a message asks to leave the program: that has to wait until the deal is settled.
-bool AsksToLeave(const platform::Message& message) {
-  return message.kind == platform::MessageKind::kClose ||
-         message.kind == platform::MessageKind::kQuit ||
-         (message.kind == platform::MessageKind::kCommand &&
-          message.commandID == platform::kCommandExit);
+/// Whether what was already waiting when the dealer began waits on until the deal is settled, as it
+/// would if it came in a pause: all but the commands of a player who is still at it.
+bool WaitsForTheEnd(const platform::Message& message) {
+  return message.kind != platform::MessageKind::kCommand ||
+         message.commandID == platform::kCommandExit;
 }
 
 }  // namespace
@@ -48,16 +40,14 @@ void CFeltsideView::DealerPlay() {
   Settle();
 }
 
-/// Clears away the commands that were already waiting when the dealer began. Taps, and what asks to
-/// leave, wait on for the end of the deal, as those do that come in a pause.
 void CFeltsideView::PumpMessages() {
   platform::CApplication& app = platform::TheApp();
   std::vector<platform::Message> later;
   platform::Message message;
   while (app.Queue().Peek(message)) {
-    if (message.kind == platform::MessageKind::kInput || AsksToLeave(message)) {
+    if (WaitsForTheEnd(message)) {
       later.push_back(message);
-    } else if (!IsPlayCommand(message)) {
+    } else {
       app.Dispatch(message);
     }
   }

@@ -111,12 +111,12 @@ TEST(Dialogs, AreWholeAndLookAsTheyDidAndCanBeRead) {
       if (!control["visible"]) continue;
       const Json& r = control["rect"];
       Rect place{r[0], r[1], r[2], r[3]};
-      EXPECT_EQ(place.Common({1, 20, 239, 293}), place) << control;
+      EXPECT_EQ(place.Intersection({1, 20, 239, 293}), place) << control;
       const Texts lines = LinesOf(control, place);
       texts.insert(texts.end(), lines.begin(), lines.end());
       if (control["kind"] == "group") continue;
       if (control["kind"] == "static") ++place.top;  // no letter reaches that high
-      for (const Rect& other : taken) EXPECT_TRUE(place.Common(other).IsEmpty()) << control;
+      for (const Rect& other : taken) EXPECT_TRUE(place.Intersection(other).IsEmpty()) << control;
       taken.push_back(place);
     }
     const platform::CBitmap shot = stylus.Shot();
