@@ -4,6 +4,7 @@
 #include <initializer_list>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "engine/blackjack_hand.h"
 #include "engine/shoe.h"
@@ -154,6 +155,13 @@ class CFeltsideView : public platform::CView {
   bool KeyDeal();
   bool KeyMark(char key);
   bool KeyTableButton(char key);
+
+  // table/tips.cpp: what the buttons on the table are called.
+
+  platform::ToolTip TipAt(platform::Point p) const override;
+  // Of the buttons that the table shows, also of those that are grey.
+  std::vector<platform::ToolTip> BlackjackTips() const;
+  std::vector<platform::ToolTip> VideoPokerTips() const;
 
   // render/frame.cpp: how a frame is put together.
 

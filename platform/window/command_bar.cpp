@@ -40,20 +40,19 @@ void CCommandBar::AddAdornments() {
 }
 
 void CCommandBar::LoadToolBar(const ToolBarTemplate& toolBar) {
-  const auto buttons =
-      toolBar.commandIDs.size() -
-      static_cast<std::size_t>(std::count(toolBar.commandIDs.begin(), toolBar.commandIDs.end(), 0));
+  const auto count = std::count_if(toolBar.buttons.begin(), toolBar.buttons.end(),
+                                   [](const ToolButton& button) { return button.commandID != 0; });
   const Size image = toolBar.imageSize;
   const CBitmap& strip = TheApp().Resources().LoadBitmap(
-      toolBar.bitmapID, {image.width * static_cast<int>(buttons), image.height});
+      toolBar.bitmapID, {image.width * static_cast<int>(count), image.height});
   int x = m_rcTitle.right + kSeparatorWidth;
-  for (const int commandID : toolBar.commandIDs) {
-    if (commandID == 0) {
+  for (const ToolButton& button : toolBar.buttons) {
+    if (button.commandID == 0) {
       m_arrSeparators.push_back(x + kSeparatorWidth / 2);
       x += kSeparatorWidth;
     } else {
       const int number = static_cast<int>(m_arrButtons.size());
-      m_arrButtons.push_back({commandID, CutOut(strip, RectAt({number * image.width, 0}, image)),
+      m_arrButtons.push_back({button, CutOut(strip, RectAt({number * image.width, 0}, image)),
                               RectAt({x, kTop}, kButtonSize), false});
       x += kButtonSize.width;
     }
@@ -66,7 +65,7 @@ void CCommandBar::RefreshStates() {
     Invalidate();
   }
   for (Button& button : m_arrButtons) {
-    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(button.commandID);
+    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(button.tool.commandID);
     if (std::exchange(button.enabled, enabled) != enabled) Invalidate();
   }
 }
@@ -89,6 +88,14 @@ void CCommandBar::OpenMenu() {
   m_bMenuOpen = true;
   m_pMenu->Open();
   Invalidate();
+}
+
+ToolTip CCommandBar::TipAt(Point p) const {
+  if (m_rcClose.Contains(p)) return {"Close", m_rcClose};
+  for (const Button& button : m_arrButtons) {
+    if (button.place.Contains(p)) return {button.tool.tip, button.place};
+  }
+  return {};
 }
 
 void CCommandBar::OnPaint(CSurface& surface) {
@@ -172,7 +179,7 @@ void CCommandBar::OnLButtonUp(Point p) {
   OnPressLost();
   if (released == Part::kClose) TheApp().Queue().Post({MessageKind::kClose, {}, 0, 0});
   if (released == Part::kButton) {
-    TheApp().Queue().PostCommand(m_arrButtons[m_nPressedButton].commandID);
+    TheApp().Queue().PostCommand(m_arrButtons[m_nPressedButton].tool.commandID);
   }
 }
 

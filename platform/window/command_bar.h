@@ -1,6 +1,7 @@
 #pragma once
 
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "platform/window/menu_window.h"
@@ -8,11 +9,17 @@
 
 namespace platform {
 
+/// A button of a tool bar; command 0 is a separator.
+struct ToolButton {
+  int commandID = 0;
+  std::string tip = {};  ///< its name and its key
+};
+
 /// A tool bar: equally large pictures side by side in one bitmap, a button for each.
 struct ToolBarTemplate {
   int bitmapID;
   Size imageSize;
-  std::vector<int> commandIDs;  ///< 0 is a separator
+  std::vector<ToolButton> buttons;
 };
 
 /// The bar above the view that holds the menu, the tool bar and the close button.
@@ -31,6 +38,7 @@ class CCommandBar : public CWindow {
   /// Opens the menu when the key is F10 or Alt with the letter of its title.
   bool OpenMenuByKey(const KeyStroke& stroke);
 
+  ToolTip TipAt(Point p) const override;
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
@@ -39,7 +47,7 @@ class CCommandBar : public CWindow {
 
  private:
   struct Button {
-    int commandID = 0;
+    ToolButton tool;
     CBitmap image;
     Rect place;
     bool enabled = false;

@@ -24,8 +24,8 @@ struct MenuTemplate {
 /// text.
 char LetterOf(const std::string& itemText);
 
-/// An open menu; at its right edge stand the keys that its items have. A chosen command is posted to the queue; then, or when it is left, the menu
-/// closes.
+/// An open menu; at its right edge stand the keys that its items have. A chosen command is posted
+/// to the queue; then, or when it is left, the menu closes.
 class CMenuWindow : public CTopWindow {
  public:
   /// The menu opens downwards from a place on the screen. It asks which items are enabled once,

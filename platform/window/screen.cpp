@@ -9,6 +9,7 @@ namespace platform {
 
 void CScreen::Push(CTopWindow& window) {
   LosePress();
+  DismissTip();
   m_arrWindows.push_back(&window);
   MarkStale();
 }
@@ -49,11 +50,25 @@ void CScreen::PressAt(Point at) {
 void CScreen::HoverAt(Point at) {
   if (Top() == nullptr || !Top()->IsEnabled()) return;
   CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
-  window.OnMouseHover(at - window.ScreenOrigin());
+  const Point origin = window.ScreenOrigin();
+  window.OnMouseHover(at - origin);
+  const ToolTip tip = window.TipAt(at - origin);
+  TipFor({tip.text, tip.tool.Moved(origin)});
+}
+
+void CScreen::TipFor(const ToolTip& tip) {
+  if (m_toolTip.Hover(tip)) MarkStale();
+}
+
+void CScreen::DismissTip() {
+  if (m_toolTip.Dismiss()) MarkStale();
 }
 
 void CScreen::HandleInput(const InputEvent& event) {
   CTopWindow* top = Top();
+  const bool moves =
+      event.kind == InputKind::kPointerMove || event.kind == InputKind::kPointerLeave;
+  if (!moves) DismissTip();
   switch (event.kind) {
     case InputKind::kPointerDown:
       PressAt(event.at);
@@ -83,6 +98,8 @@ void CScreen::HandleInput(const InputEvent& event) {
       if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
       break;
     case InputKind::kPointerLeave:
+      TipFor({});
+      break;
     case InputKind::kMiddleClick:
     case InputKind::kComposition:
     case InputKind::kClose:
@@ -92,6 +109,7 @@ void CScreen::HandleInput(const InputEvent& event) {
 
 void CScreen::PaintAll() {
   for (CTopWindow* window : m_arrWindows) window->PaintIfNeeded();
+  if (m_toolTip.ShowWhenDue()) MarkStale();
 }
 
 void CScreen::Present() {
@@ -99,12 +117,14 @@ void CScreen::Present() {
   m_bStale = false;
   const CBitmap& whole = Top()->Pixels();
   // The frame alone needs no other picture than its own.
-  if (m_arrWindows.size() == 1 && whole.GetSize() == m_size) return TheHost().Show(whole);
+  const bool alone = m_arrWindows.size() == 1 && TipText().empty();
+  if (alone && whole.GetSize() == m_size) return TheHost().Show(whole);
   CBitmap pixels(m_size);
   CSurface surface(pixels);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
+  m_toolTip.Draw(surface);
   TheHost().Show(pixels);
 }
 

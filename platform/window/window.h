@@ -5,6 +5,7 @@
 
 #include "platform/draw/surface.h"
 #include "platform/host/input.h"
+#include "platform/window/tool_tip.h"
 
 namespace platform {
 
@@ -58,6 +59,8 @@ class CWindow {
   virtual void OnLButtonUp(Point) {}
   /// While a mouse moves with nothing down, in the topmost window; beside it too.
   virtual void OnMouseHover(Point) {}
+  /// What is said of the tool at a place, to a mouse that rests there.
+  virtual ToolTip TipAt(Point) const { return {}; }
   /// The press that this window had is over without a release: it was disabled or hidden meanwhile,
   /// or another window opened.
   virtual void OnPressLost() {}

@@ -22,8 +22,14 @@ platform::MenuTemplate MainMenu() {
 platform::ToolBarTemplate MainToolBar() {
   return {IDR_MAINFRAME,
           {16, 15},
-          {kCommandHit, kCommandStand, kSeparator, kCommandDoubleDown, kSeparator, kCommandSplit,
-           kSeparator, kCommandDeal}};
+          {{kCommandHit, "Hit (H)"},
+           {kCommandStand, "Stand (S)"},
+           {kSeparator},
+           {kCommandDoubleDown, "Double Down (D)"},
+           {kSeparator},
+           {kCommandSplit, "Split (P)"},
+           {kSeparator},
+           {kCommandDeal, "Deal (Enter)"}}};
 }
 
 std::vector<platform::Accelerator> MainAccelerators() {
