@@ -4,6 +4,7 @@
 #include <initializer_list>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "engine/blackjack_hand.h"
 #include "engine/shoe.h"
@@ -98,10 +99,10 @@ class CFeltsideView : public platform::CView {
   // table/dealer_play.cpp: the dealer's turn and the settlement.
 
   /// The dealer draws, with a pause between cards, and the deal is settled before this returns.
-  /// Meanwhile the frame is disabled; keys that come are dropped.
+  /// Meanwhile the frame is disabled; keys that come are dropped, taps wait until it is over.
   void DealerPlay();
-  /// Handles what was already waiting when the dealer began. The disabled frame drops commands,
-  /// taps and keys; what asks to leave the program waits on until the deal is settled.
+  /// Clears away the commands that were already waiting when the dealer began: the disabled frame
+  /// refuses them. Taps, keys and what asks to leave the program wait on, as in the pauses.
   void PumpMessages();
   /// Ends the deal and moves its money, with the dealer's hand as it stands.
   void Settle();
@@ -154,6 +155,13 @@ class CFeltsideView : public platform::CView {
   bool KeyDeal();
   bool KeyMark(char key);
   bool KeyTableButton(char key);
+
+  // table/tips.cpp: what the buttons on the table are called.
+
+  platform::ToolTip TipAt(platform::Point p) const override;
+  // Of the buttons that the table shows, also of those that are grey.
+  std::vector<platform::ToolTip> BlackjackTips() const;
+  std::vector<platform::ToolTip> VideoPokerTips() const;
 
   // render/frame.cpp: how a frame is put together.
 

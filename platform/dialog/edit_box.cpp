@@ -170,7 +170,8 @@ bool CEditBox::OnChar(const std::string& text) {
 }
 
 void CEditBox::OnFocus(bool focused) {
-  TheHost().SetTextInput(focused);
+  const Rect place = GetClientRect().Moved(ScreenOrigin());
+  TheHost().SetTextInput(focused ? std::optional(place) : std::nullopt);
   Invalidate();
 }
 

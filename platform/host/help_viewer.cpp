@@ -62,13 +62,14 @@ fs::path HelpPage(const std::vector<fs::path>& folders, const std::string& comma
   return fs::is_regular_file(folder / page, error) ? folder / page : fs::path{};
 }
 
-void StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
+bool StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
   const fs::path page = HelpPage(folders, commandLine);
   if (page.empty()) {
     std::cerr << "The help pages are not there.\n";
-    return;
+    return false;
   }
   OpenDetached(page.string());
+  return true;
 }
 
 }  // namespace platform

@@ -1,0 +1,59 @@
+#include "shell/window_memory.h"
+
+#include <array>
+#include <optional>
+
+#include "platform/host/host.h"
+#include "platform/window/application.h"
+
+namespace feltside {
+namespace {
+
+constexpr const char* kSection = "Window";
+
+struct Entry {
+  const char* name;
+  int platform::Rect::*side;
+};
+constexpr std::array<Entry, 4> kEntries = {{
+    {"LEFT", &platform::Rect::left},
+    {"TOP", &platform::Rect::top},
+    {"RIGHT", &platform::Rect::right},
+    {"BOTTOM", &platform::Rect::bottom},
+}};
+constexpr const char* kMaximized = "MAXIMIZED";
+
+/// The desktops of today end long before this, on either side.
+constexpr int kFarthest = 100000;
+
+bool IsSensible(const platform::Rect& rect) {
+  const platform::Rect all{-kFarthest, -kFarthest, kFarthest, kFarthest};
+  return !rect.IsEmpty() && rect.Common(all) == rect;
+}
+
+std::optional<platform::WindowPlace> StoredPlace() {
+  const platform::CProfile& profile = platform::TheApp().Profile();
+  platform::WindowPlace place;
+  for (const Entry& entry : kEntries)
+    place.rect.*entry.side = profile.GetInt(kSection, entry.name, 0);
+  place.maximized = profile.GetInt(kSection, kMaximized, 0) == 1;
+  return IsSensible(place.rect) ? std::optional(place) : std::nullopt;
+}
+
+}  // namespace
+
+void RestoreWindowPlace() {
+  if (const auto place = StoredPlace()) platform::TheHost().SetWindowPlace(*place);
+}
+
+void StoreWindowPlace() {
+  const auto place = platform::TheHost().GetWindowPlace();
+  if (!place || place == StoredPlace()) return;
+  const platform::CProfile& profile = platform::TheApp().Profile();
+  for (const Entry& entry : kEntries) {
+    profile.WriteInt(kSection, entry.name, place->rect.*entry.side);
+  }
+  profile.WriteInt(kSection, kMaximized, place->maximized ? 1 : 0);
+}
+
+}  // namespace feltside
