@@ -21,10 +21,6 @@ class OffscreenHost : public Host {
   /// Called when the program waits for input and there is none, again and again until it has put
   /// some in. Once it answers false, and without a handler, the window is closed.
   void SetIdleHandler(std::function<bool()> onIdle) { m_onIdle = std::move(onIdle); }
-  /// Called with every shown picture.
-  void SetFrameHandler(std::function<void(const CBitmap&)> onFrame) {
-    m_onFrame = std::move(onFrame);
-  }
 
   const CBitmap& Shown() const { return m_shown; }
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
@@ -33,7 +29,7 @@ class OffscreenHost : public Host {
   /// Whether help viewers come up from now on.
   void SetHelpViewer(bool there) { m_bHelpViewer = there; }
 
-  void Show(const CBitmap& frame) override;
+  void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
   void SetWindowPlace(const WindowPlace& place) override { m_windowPlace = place; }
   std::optional<WindowPlace> GetWindowPlace() override { return m_windowPlace; }
@@ -54,7 +50,6 @@ class OffscreenHost : public Host {
   std::filesystem::path m_profileFolder;
   std::deque<InputEvent> m_arrInput;
   std::function<bool()> m_onIdle;
-  std::function<void(const CBitmap&)> m_onFrame;
   std::int64_t m_nTicks = 0;
   LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then

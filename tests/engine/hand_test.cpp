@@ -75,10 +75,10 @@ TEST(BlackjackHand, Scores) {
     int total, pair, soft;
   };
   for (const Case& c :
-       {Case{"", 0, 0, 0}, Case{"A", 11, 0, 1}, Case{"A K", 21, 0, 1}, Case{"A A", 12, 1, 1},
-        Case{"A A 9", 21, 0, 1}, Case{"A A T", 12, 0, 0}, Case{"A 6 T", 17, 0, 0},
-        Case{"A A A A A 6", 21, 0, 1}, Case{"T K", 20, 0, 0}, Case{"J Q", 20, 0, 0},
-        Case{"K K", 20, 1, 0}, Case{"7 7 7", 21, 0, 0}, Case{"T 9 5", 24, 0, 0}}) {
+       {Case{"", 0, 0, 0}, Case{"AC", 11, 0, 1}, Case{"AC KD", 21, 0, 1}, Case{"AC AD", 12, 1, 1},
+        Case{"AC AD 9H", 21, 0, 1}, Case{"AC AD TH", 12, 0, 0}, Case{"AC 6D TH", 17, 0, 0},
+        Case{"AC AD AH AS AC 6D", 21, 0, 1}, Case{"TC KD", 20, 0, 0}, Case{"JC QD", 20, 0, 0},
+        Case{"KC KD", 20, 1, 0}, Case{"7C 7D 7H", 21, 0, 0}, Case{"TC 9D 5H", 24, 0, 0}}) {
     const auto hand = ParseHand<CBlackjackHand>(c.cards);
     EXPECT_EQ(hand.GetTotal(), c.total) << c.cards;
     EXPECT_EQ(hand.IsPair(), c.pair) << c.cards;

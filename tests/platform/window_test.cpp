@@ -40,7 +40,7 @@ TEST(Screen, TakesInputWithNoWindowOpen) {
 
 TEST(Screen, IsShownWholeWithASmallWindowAlone) {
   DeskHost host;
-  host.SetFrameHandler([](const auto& frame) { EXPECT_EQ(frame.GetSize(), kScreen); });
+  host.SetFrameHandler([&host] { EXPECT_EQ(host.Shown().GetSize(), kScreen); });
   App([] { platform::MessageBox("Too early"); }).Main();
   EXPECT_EQ(host.Shown().GetSize(), kScreen);
 }
@@ -53,7 +53,7 @@ platform::CBitmap ShotAfter(const std::vector<std::string>& commands) {
 
 TEST(Windows, LeaveNothingBehindThemWhenTheyGo) {
   using Commands = std::vector<std::string>;
-  const std::string cards = StackOf("TH 2D KS 7C 2C 2H");
+  const std::string cards = "stack TH 2D KS 7C 2C 2H";
   const std::vector<std::pair<Commands, Commands>> cases = {
       {{"command 32777", "key Tab", "key Tab"},
        {"command 32777", "key Tab", "key Tab", "key F4", "key Escape"}},

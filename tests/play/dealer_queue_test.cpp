@@ -41,7 +41,7 @@ class DealersTurn : public testing::Test {
   DealersTurn() {
     m_desk.Table().Stack({10, 8, 23, 15, 4, 5});
     m_desk.Command(kCommandDeal);
-    m_desk.Host().SetFrameHandler([this](auto&) { m_arrStates.push_back(m_desk.State()); });
+    m_desk.Host().SetFrameHandler([this] { m_arrStates.push_back(m_desk.State()); });
   }
 
   /// Lets the dealer play with these messages waiting behind the Stand that starts it.

@@ -70,8 +70,8 @@ int CardsLeft(const Json& state) {
 }
 
 std::string Player::AtTheTable(const Json& state) {
-  static const Texts kMoves = {"command 32771", "command 32772", "command 32773",
-                               "command 32775", "command 32776", "command 32776"};
+  static const Texts kMoves = {"command hit",    "command stand", "command split",
+                               "command double", "command deal",  "command deal"};
   static const Texts kTargets = {"tap 90 160",  "tap 110 160", "tap 100 160", "tap 110 165",
                                  "tap 60 195",  "tap 190 195", "tap 180 118", "tap 100 200",
                                  "tap 120 185", "tap 54 130",  "tap 87 130",  "tap 120 130",
@@ -79,8 +79,8 @@ std::string Player::AtTheTable(const Json& state) {
   static const Texts kKeys = {"key H", "key S", "key D",   "key P",     "key I",     "key N",
                               "key B", "key +", "key -",   "key 1",     "key 2",     "key 3",
                               "key 4", "key 5", "key F10", "key Enter", "key Space", "key Alt+B"};
-  static const Texts kDialogs = {"command 32779", "command 32777", "command 32781", "command 57664",
-                                 "command 57665"};
+  static const Texts kDialogs = {"command game-setup", "command table-setup", "command scores",
+                                 "command about", "command exit"};
   static const Texts kMalformed = {"hit",         "tap",     "tap x y",   "stack 99",
                                    "wallet much", "key Hit", "clock now", "press 1 2"};
   const bool poker = state["m_nGameType"] == 1;

@@ -16,10 +16,5 @@ INSTANTIATE_TEST_SUITE_P(Of, Scripts,
                                          "dialog_stylus", "high_scores", "menu", "settings",
                                          "setup", "stylus", "tips", "video_poker"));
 
-TEST(ScriptsByKeys, RunAsWritten) {
-  PlayScript("blackjack_hands", Door::kKeys);
-  PlayScript("video_poker", Door::kKeys);
-}
-
 }  // namespace
 }  // namespace feltside::tests

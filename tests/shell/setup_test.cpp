@@ -11,11 +11,11 @@ TEST(Setup, WritesInItsOrderAndHoldsForTheRunWhenItCannotBeKept) {
   Stylus stylus;
   stylus.Send("state");
   std::filesystem::create_directories(stylus.ProfileFile());  // where the file should be
-  for (const char* command : {"command 32779", "select 1008 2", "select 1007 0", "press 1"}) {
+  for (const char* command : {"command game-setup", "select 1008 2", "select 1007 0", "press 1"}) {
     Do(stylus, command);
   }
-  for (const char* command : {"command 32777", "press 1014", "press 1"}) Do(stylus, command);
-  EXPECT_EQ(Missing(stylus.Send("command 32776"),
+  for (const char* command : {"command table-setup", "press 1014", "press 1"}) Do(stylus, command);
+  EXPECT_EQ(Missing(stylus.Send("command deal"),
                     {{"m_nStrategyMode", 2}, {"m_nDealerDelay", 2000}, {"m_bFancyBlackjack", 0}}),
             "");
   std::vector<std::string> written;
