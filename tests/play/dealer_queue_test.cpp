@@ -124,6 +124,16 @@ TEST_F(DealersTurn, ClosesAfterwardsWhenAskedInAPause) {
   ExpectShown(m_settled);
 }
 
+TEST(DoubleDown, IsShownBeforeTheDealerDraws) {
+  Desk desk;
+  desk.Table().Stack({6, 5, 23, 15, 9, 4, 5});
+  desk.Command(kCommandDeal);
+  std::vector<Json> states;
+  desk.Host().SetFrameHandler([&] { states.push_back(desk.State()); });
+  desk.Command(kCommandDoubleDown);
+  EXPECT_EQ(Missing(states.at(0), {{"m_handPlayer", {6, 5, 9}}, {"m_bHandInProgress", 1}}), "");
+}
+
 TEST(DealersPause, IsAsLongAsThePlaySpeedSays) {
   for (const auto& [speed, milliseconds] : {std::pair{0, 2000}, {1, 1000}, {2, 200}}) {
     Desk desk("[Settings]\nPLAYSPEED = " + std::to_string(speed));
