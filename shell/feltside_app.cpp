@@ -9,6 +9,7 @@
 #include "shell/main_frame.h"
 #include "shell/res/frame_resources.h"
 #include "shell/res/pictures.h"
+#include "shell/settings.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -51,6 +52,11 @@ bool CFeltsideApp::InitInstance() {
 int CFeltsideApp::ExitInstance() {
   SaveHighScores();
   return CApplication::ExitInstance();
+}
+
+const platform::CProfileSection& CFeltsideApp::ReadSettings() {
+  m_settings = Profile().Read(kSettingsSection);
+  return m_settings;
 }
 
 void CFeltsideApp::OnNew() { OpenNewDocument(); }

@@ -116,7 +116,10 @@ class CFeltsideView : public platform::CView {
   bool KeyTableButton(char key);
 
   // Settings.
+  struct Settings;
   void LoadSettings();
+  /// Stores these in one step, in this order.
+  void StoreSettings(std::initializer_list<const char*> names);
   int PlaySpeed() const;
   void SetPlaySpeed(int speed);
 
