@@ -9,6 +9,7 @@
 #include "shell/main_frame.h"
 #include "shell/res/frame_resources.h"
 #include "shell/res/pictures.h"
+#include "shell/settings.h"
 #include "shell/window_memory.h"
 #include "table/feltside_view.h"
 
@@ -54,6 +55,11 @@ int CFeltsideApp::ExitInstance() {
   SaveHighScores();
   StoreWindowPlace();
   return CApplication::ExitInstance();
+}
+
+const platform::CProfileSection& CFeltsideApp::ReadSettings() {
+  m_settings = Profile().Read(kSettingsSection);
+  return m_settings;
 }
 
 void CFeltsideApp::OnNew() { OpenNewDocument(); }

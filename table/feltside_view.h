@@ -189,10 +189,13 @@ class CFeltsideView : public platform::CView {
   void DrawVideoPokerTable(platform::CSurface& surface);
   void DrawFancyPokerTexts(platform::CSurface& surface);
 
-  // shell/settings.cpp: the player's choices, from the profile.
+  // shell/settings.cpp: the player's choices, from the profile and back.
 
+  struct Settings;
   /// While a hand is played its game stays selected, whatever the profile says.
   void LoadSettings();
+  /// Stores these in one step, in this order.
+  void StoreSettings(std::initializer_list<const char*> names);
   /// Sets the dealer's pause by a speed, 0 slow to 2 fast; any other leaves it as it was.
   void SetPlaySpeed(int speed);
   /// The speed that the pause stands for; -1 for none.

@@ -73,7 +73,7 @@ void CApplication::OnIdle() {
 }
 
 void CApplication::SetRegistryKey(const std::string& key) {
-  m_pProfile = std::make_unique<CProfile>(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
+  m_pProfile = OpenProfile(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
 }
 
 void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate) {

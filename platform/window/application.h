@@ -34,8 +34,8 @@ class CApplication : public CCommandTarget {
   CMessageQueue& Queue() { return m_queue; }
   CScreen& Screen() { return m_screen; }
   CResources& Resources() { return m_resources; }
-  /// The settings' file; SetRegistryKey comes first.
-  const CProfile& Profile() const { return *m_pProfile; }
+  /// Where the player's choices are kept; SetRegistryKey comes first.
+  CProfile& Profile() const { return *m_pProfile; }
   CFrameWindow* MainFrame() const { return m_pMainFrame; }
 
   /// Handles one message. kQuit is not for here.
