@@ -51,13 +51,11 @@ void CFeltsideView::LoadSettings() {
   SetPlaySpeed(ReadSetting("PLAYSPEED", kNormalSpeed));
 }
 
-/// Any other speed leaves the pause as it was.
 void CFeltsideView::SetPlaySpeed(int speed) {
   if (speed < 0 || speed >= static_cast<int>(kDealerDelays.size())) return;
   m_nDealerDelay = kDealerDelays[static_cast<std::size_t>(speed)];
 }
 
-/// The speed that the dealer's pause stands for; -1 for a pause of no speed.
 int CFeltsideView::PlaySpeed() const {
   for (std::size_t speed = 0; speed < kDealerDelays.size(); ++speed) {
     if (kDealerDelays[speed] == m_nDealerDelay) return static_cast<int>(speed);

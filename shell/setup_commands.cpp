@@ -35,7 +35,6 @@ void CFeltsideView::OnGameSetup() {
   SetPlaySpeed(dialog.m_nSpeed);
   WriteSetting("PLAYSPEED", dialog.m_nSpeed);
   OnDeal();
-  Repaint();
 }
 
 void CFeltsideView::OnTableSetup() {

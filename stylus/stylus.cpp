@@ -158,6 +158,7 @@ CStylus::Json CStylus::State() {
     state["focus"] = FocusOf(*dialog);
   }
   state["typing"] = m_host.TextPlace().has_value();
+  state["tip"] = m_app.Screen().TipText();
   state["helps"] = m_host.HelpCalls();
   state["running"] = true;
   return state;

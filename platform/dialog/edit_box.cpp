@@ -61,8 +61,8 @@ void CEditBox::OnPaint(CSurface& surface) {
               .Moved(shift)
               .Shrunk(-1);
       inner.FillRect(marked, kHighlight);
-      CSurface highlighted(pixels, marked.Common(pixels.Bounds()));
-      const Point origin = marked.Common(pixels.Bounds()).TopLeft();
+      CSurface highlighted(pixels, marked.Intersection(pixels.Bounds()));
+      const Point origin = marked.Intersection(pixels.Bounds()).TopLeft();
       highlighted.DrawStencil(Point{CaretX(from), top} + shift - origin, stencil, kWhite);
     }
     const int x = CaretX(m_nCaret) - 1 + shift.x;

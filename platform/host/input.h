@@ -45,6 +45,9 @@ struct KeyStroke {
 /// where it names none.
 std::optional<KeyStroke> ParseChord(const std::string& text);
 
+/// The text that ParseChord takes for a key stroke.
+std::string ChordText(const KeyStroke& stroke);
+
 enum class InputKind {
   kPointerDown,
   kPointerMove,  ///< while the stylus is down or the mouse hovers

@@ -40,7 +40,7 @@ void CApplication::RunUntil(const std::function<bool()>& done) {
   while (!m_bQuit && !done()) {
     if (!m_queue.Peek(message)) {
       OnIdle();
-      m_queue.Wait();
+      m_queue.Wait(m_screen.TimeToTip());
     } else if (message.kind == MessageKind::kQuit) {
       m_bQuit = true;
       m_nExitCode = message.exitCode;

@@ -9,6 +9,7 @@ namespace platform {
 
 void CScreen::Push(CTopWindow& window) {
   LosePress();
+  DismissTip();
   m_arrWindows.push_back(&window);
   MarkStale();
 }
@@ -46,14 +47,38 @@ void CScreen::PressAt(Point at) {
   pressed.OnLButtonDown(at - pressed.ScreenOrigin());
 }
 
+void CScreen::HoverAt(Point at) {
+  if (Top() == nullptr || !Top()->IsEnabled()) return;
+  CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
+  const Point origin = window.ScreenOrigin();
+  window.OnMouseHover(at - origin);
+  const ToolTip tip = window.TipAt(at - origin);
+  TipFor({tip.text, tip.tool.Moved(origin)});
+}
+
+void CScreen::TipFor(const ToolTip& tip) {
+  if (m_toolTip.Hover(tip)) MarkStale();
+}
+
+void CScreen::DismissTip() {
+  if (m_toolTip.Dismiss()) MarkStale();
+}
+
 void CScreen::HandleInput(const InputEvent& event) {
   CTopWindow* top = Top();
+  const bool moves =
+      event.kind == InputKind::kPointerMove || event.kind == InputKind::kPointerLeave;
+  if (!moves) DismissTip();
   switch (event.kind) {
     case InputKind::kPointerDown:
       PressAt(event.at);
       break;
     case InputKind::kPointerMove:
-      if (m_pPressed != nullptr) m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
+      if (m_pPressed == nullptr) {
+        HoverAt(event.at);
+      } else {
+        m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
+      }
       break;
     case InputKind::kPointerUp:
       if (CWindow* pressed = m_pPressed; pressed != nullptr) {
@@ -62,8 +87,8 @@ void CScreen::HandleInput(const InputEvent& event) {
       }
       break;
     case InputKind::kWheel:
-      if (CTopWindow* window = WindowUnder(event.at); window == top && top->IsEnabled()) {
-        window->WindowAt(event.at - window->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
+      if (top != nullptr && top == WindowUnder(event.at) && top->IsEnabled()) {
+        top->WindowAt(event.at - top->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
       }
       break;
     case InputKind::kKey:
@@ -73,6 +98,8 @@ void CScreen::HandleInput(const InputEvent& event) {
       if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
       break;
     case InputKind::kPointerLeave:
+      TipFor({});
+      break;
     case InputKind::kMiddleClick:
     case InputKind::kComposition:
     case InputKind::kClose:
@@ -82,20 +109,22 @@ void CScreen::HandleInput(const InputEvent& event) {
 
 void CScreen::PaintAll() {
   for (CTopWindow* window : m_arrWindows) window->PaintIfNeeded();
+  if (m_toolTip.ShowWhenDue()) MarkStale();
 }
 
 void CScreen::Present() {
   if (!m_bStale || m_arrWindows.empty()) return;
   m_bStale = false;
-  if (m_arrWindows.size() == 1) {
-    TheHost().Show(Top()->Pixels());
-    return;
-  }
+  const CBitmap& whole = Top()->Pixels();
+  // The frame alone needs no other picture than its own.
+  const bool alone = m_arrWindows.size() == 1 && TipText().empty();
+  if (alone && whole.GetSize() == m_size) return TheHost().Show(whole);
   CBitmap pixels(m_size);
   CSurface surface(pixels);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
+  m_toolTip.Draw(surface);
   TheHost().Show(pixels);
 }
 

@@ -9,7 +9,7 @@ namespace platform {
 CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
     : CWindow(nullptr, place),
       m_strTitle(std::move(title)),
-      m_kind(kind),
+      m_eKind(kind),
       m_pixels({place.Width(), place.Height()}) {}
 
 CTopWindow::~CTopWindow() { Close(); }

@@ -1,4 +1,5 @@
-// The menu and every dialog: as a person has looked at them, whole, and every text readable.
+// The menu, a tool tip and every dialog: as a person has looked at them, whole, and every text
+// readable.
 
 #include <gtest/gtest.h>
 
@@ -31,8 +32,9 @@ const std::string kFive =
 const std::string kLongName = "type A name that is longer than a line of the list";
 const std::string kRich = "wallet 250";
 const std::string kExit = "command 57665";
-const Texts kMenu = {"&BlackJack", "&Game Setup", "&Table Setup ", "High Scores",
-                     "&About...",  "Help...",     "E&xit"};
+const Texts kMenu = {"&BlackJack",  "&Game Setup", "&Table Setup ",
+                     "High Scores", "&About...",   "Help...",
+                     "E&xit",       "F1",          "Ctrl+Q"};
 const Texts kBacks = {"Blue",          "Black",          "Purple",    "Smiley",
                       "Dirty Yellow ", "Skull",          "Blue Star", "Purple Star",
                       "Metal Rivet",   "Red Pinstripes", "Wild",      "Blue Pinstripes"};
@@ -40,6 +42,7 @@ const Texts kBacks = {"Blue",          "Black",          "Purple",    "Smiley",
 const std::vector<Scene> kScenes = {
     {"menu", {StackOf("TH 6D KS 7C"), "command 32776", "key F10", "key Down"}, kMenu},
     {"", {"touch 30 12"}, kMenu, kFive},
+    {"tip", {"move 228 12"}, {"Close"}},
     {"dialog_about", {"command 57664"}, {"About Feltside"}},
     {"dialog_setup", {"command 32779"}, {"Setup", "?"}},
     {"dialog_setup_list",
@@ -110,12 +113,12 @@ TEST(Dialogs, AreWholeAndLookAsTheyDidAndCanBeRead) {
       if (!control["visible"]) continue;
       const Json& r = control["rect"];
       Rect place{r[0], r[1], r[2], r[3]};
-      EXPECT_EQ(place.Common({1, 20, 239, 293}), place) << control;
+      EXPECT_EQ(place.Intersection({1, 20, 239, 293}), place) << control;
       const Texts lines = LinesOf(control, place);
       texts.insert(texts.end(), lines.begin(), lines.end());
       if (control["kind"] == "group") continue;
       if (control["kind"] == "static") ++place.top;  // no letter reaches that high
-      for (const Rect& other : taken) EXPECT_TRUE(place.Common(other).IsEmpty()) << control;
+      for (const Rect& other : taken) EXPECT_TRUE(place.Intersection(other).IsEmpty()) << control;
       taken.push_back(place);
     }
     const platform::CBitmap shot = stylus.Shot();

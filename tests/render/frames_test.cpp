@@ -5,7 +5,7 @@
 
 #include "platform/draw/look.h"
 #include "platform/draw/resources.h"
-#include "render/number_text.h"
+#include "render/money_text.h"
 #include "shell/res/pictures.h"
 #include "tests/render/contrast.h"
 #include "tests/support/golden.h"
@@ -129,8 +129,8 @@ Texts TextsOf(const Json& state) {
   if (state["m_bShowTitle"] == 1) return {};
   const double wallet = state["m_dWallet"];
   if (state["m_nGameType"] == 0) {
-    Texts texts = {"Dealer", "Player", NumberText("Wallet: $%.2f", wallet),
-                   NumberText("Current Bet: $%d", state["m_nBet"].get<int>())};
+    Texts texts = {"Dealer", "Player", "Wallet: " + MoneyText(wallet, 2),
+                   "Current Bet: " + MoneyText(state["m_nBet"], 0)};
     if (state["m_handSplit"].empty()) texts.push_back("You");
     for (const char* member : {"m_strPlayerScore", "m_strPlayerMsg", "m_strSplitScore",
                                "m_strSplitMsg", "m_strDealerScore"}) {
@@ -140,7 +140,7 @@ Texts TextsOf(const Json& state) {
   }
   Texts texts = {state["m_bHandInProgress"] == 0 ? "Deal" : "Play", state["m_strPlayerMsg"]};
   if (state["m_bFancyPoker"] == 1) {
-    texts.push_back(NumberText("$%.0f", std::floor(wallet + 0.5)));
+    texts.push_back(MoneyText(std::floor(wallet + 0.5), 0));
   } else {
     // A single digit might be found on a card; it stands on the same white as all of these.
     for (const char* text :
@@ -148,7 +148,7 @@ Texts TextsOf(const Json& state) {
           "Four of a Kind", "20", "Three of a Kind", "Full House", "Two Pair"}) {
       texts.push_back(text);
     }
-    texts.push_back(NumberText("$%d", static_cast<int>(wallet)));
+    texts.push_back(MoneyText(std::trunc(wallet), 0));
   }
   return texts;
 }
