@@ -100,7 +100,7 @@ Rect StillThere(SDL_Window* window, const Rect& part) {
   Display* display = DisplayOf(window);
   if (display == nullptr) return part;
   const XLibrary library(display);
-  return library.IsComplete() ? part.Common(RectAt({}, library.DesktopSize())) : part;
+  return library.IsComplete() ? part.Intersection(RectAt({}, library.DesktopSize())) : part;
 }
 
 }  // namespace platform

@@ -202,7 +202,7 @@ std::vector<Rect> SdlWindow::RoomBehindFullScreen() const {
   const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
   std::vector<Rect> room;
   for (Rect display : UsableDisplays()) {
-    display = StillThere(m_pWindow, display.Common(CurrentRect()));
+    display = StillThere(m_pWindow, display.Intersection(CurrentRect()));
     if (bar.y > 0 && bar.y <= kTitleBar * 2) display.top += bar.y;
     if (!display.IsEmpty()) room.push_back(display);
   }
