@@ -32,11 +32,10 @@ bool IsSensible(const platform::Rect& rect) {
 }
 
 std::optional<platform::WindowPlace> StoredPlace() {
-  const platform::CProfile& profile = platform::TheApp().Profile();
+  const platform::CProfileSection section = platform::TheApp().Profile().Read(kSection);
   platform::WindowPlace place;
-  for (const Entry& entry : kEntries)
-    place.rect.*entry.side = profile.GetInt(kSection, entry.name, 0);
-  place.maximized = profile.GetInt(kSection, kMaximized, 0) == 1;
+  for (const Entry& entry : kEntries) place.rect.*entry.side = section.GetInt(entry.name, 0);
+  place.maximized = section.GetInt(kMaximized, 0) == 1;
   return IsSensible(place.rect) ? std::optional(place) : std::nullopt;
 }
 
@@ -49,11 +48,10 @@ void RestoreWindowPlace() {
 void StoreWindowPlace() {
   const auto place = platform::TheHost().GetWindowPlace();
   if (!place || place == StoredPlace()) return;
-  const platform::CProfile& profile = platform::TheApp().Profile();
-  for (const Entry& entry : kEntries) {
-    profile.WriteInt(kSection, entry.name, place->rect.*entry.side);
-  }
-  profile.WriteInt(kSection, kMaximized, place->maximized ? 1 : 0);
+  platform::TheApp().Profile().Update(kSection, [&place](platform::CProfileSection& section) {
+    for (const Entry& entry : kEntries) section.Set(entry.name, place->rect.*entry.side);
+    section.Set(kMaximized, place->maximized ? 1 : 0);
+  });
 }
 
 }  // namespace feltside

@@ -23,6 +23,7 @@ constexpr int kMostLinks = 20;                        ///< more of them run in a
 constexpr std::size_t kLargestFile = 1 << 20;         ///< bytes; a larger one is none of ours
 constexpr std::chrono::milliseconds kPatience{1000};  ///< with a game that does not let go
 constexpr char kNoMemory[] = "there is no memory left";
+constexpr char kNoHome[] = "There is no home folder to keep the settings in.";
 
 /// What the file holds, or why that cannot be said.
 struct Contents {
@@ -114,6 +115,10 @@ class CFileProfile : public CProfile {
 };
 
 CProfileSection CFileProfile::Read(const std::string& section) {
+  if (m_file.empty()) {
+    Tell(kNoHome);
+    return {};
+  }
   std::string refusal;
   try {
     Contents contents = ReadUnlocked(section);
@@ -127,6 +132,10 @@ CProfileSection CFileProfile::Read(const std::string& section) {
 }
 
 bool CFileProfile::Update(const std::string& section, const Change& change) {
+  if (m_file.empty()) {
+    Tell(kNoHome);
+    return false;
+  }
   std::string refusal;
   try {
     refusal = Store(section, change);

@@ -73,7 +73,8 @@ void CApplication::OnIdle() {
 }
 
 void CApplication::SetRegistryKey(const std::string& key) {
-  m_pProfile = OpenProfile(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
+  const std::filesystem::path folder = TheHost().ProfileFolder();
+  m_pProfile = OpenProfile(folder.empty() ? folder : folder / key / (m_strName + ".toml"));
 }
 
 void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate) {
