@@ -28,7 +28,7 @@ constexpr int kFarthest = 100000;
 
 bool IsSensible(const platform::Rect& rect) {
   const platform::Rect all{-kFarthest, -kFarthest, kFarthest, kFarthest};
-  return !rect.IsEmpty() && rect.Common(all) == rect;
+  return !rect.IsEmpty() && rect.Intersection(all) == rect;
 }
 
 std::optional<platform::WindowPlace> StoredPlace() {

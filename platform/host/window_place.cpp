@@ -6,7 +6,7 @@ namespace platform {
 namespace {
 
 int SharedArea(const Rect& a, const Rect& b) {
-  const Rect shared = a.Common(b);
+  const Rect shared = a.Intersection(b);
   return shared.IsEmpty() ? 0 : shared.Width() * shared.Height();
 }
 
