@@ -38,7 +38,7 @@ OURS = [
 ]
 
 SDL = r"SDL.*"
-SYSTEM = r"(sys/\w+|fcntl|unistd|signal|poll|errno|dirent)\.h"
+SYSTEM = r"(sys/\w+|fcntl|unistd|pwd|signal|poll|errno|dirent)\.h"
 GTEST = r"g(test|mock)/g(test|mock).*\.h"
 JSON = r"nlohmann/.*"
 

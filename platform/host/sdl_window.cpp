@@ -12,6 +12,8 @@ namespace {
 /// that a whole multiple must fill to be preferred when it opens, both in percent.
 constexpr int kComfortablePercent = 90;
 constexpr int kFirstLeastPercent = 75;
+/// Window managers put a bar of about so many rows above what they have put in the middle.
+constexpr int kTitleBar = 24;
 
 /// The colour around a picture that does not fill the window.
 constexpr Uint8 kSurround = 32;
@@ -33,7 +35,9 @@ std::vector<Rect> UsableDisplays() {
 Size ComfortableSize(Size frame) {
   const std::vector<Rect> displays = UsableDisplays();
   if (displays.empty()) return frame;
-  const auto comfortable = [](int side) { return std::max(1, side * kComfortablePercent / 100); };
+  const auto comfortable = [](int side) {
+    return std::max(1, std::min(side * kComfortablePercent / 100, side - 2 * kTitleBar));
+  };
   return FittingSize(frame, {comfortable(displays[0].Width()), comfortable(displays[0].Height())},
                      kFirstLeastPercent);
 }
@@ -125,14 +129,19 @@ std::optional<WindowPlace> SdlWindow::GetPlace() const {
 void SdlWindow::Show(const CBitmap& frame) {
   m_frame = frame;
   m_bStale = true;
-  if (!m_bShown) {
-    SDL_ShowWindow(m_pWindow);
-    SDL_PumpEvents();
-    m_bShown = true;
-    m_rcOpened = m_rcNormal = CurrentRect();
-    if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
-  }
+  if (!m_bShown) Appear();
   Settle();
+}
+
+void SdlWindow::Appear() {
+  m_bShown = true;
+  SDL_ShowWindow(m_pWindow);
+  SDL_PumpEvents();
+  m_rcOpened = CurrentRect();
+  const Rect inside = MovedOnto(UsableDisplays(), m_rcOpened);
+  if (inside != m_rcOpened) PutAt(inside);
+  m_rcNormal = CurrentRect();
+  if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
 }
 
 void SdlWindow::OnWindowEvent(const SDL_WindowEvent& event) {
@@ -184,13 +193,25 @@ void SdlWindow::EnterFullScreen() {
   SDL_Rect display;
   if (SDL_GetDisplayBounds(SDL_GetWindowDisplayIndex(m_pWindow), &display) != 0) return;
   m_bFillsDisplay = true;
-  PutAt(ToRect(display));
+  PutAt(StillThere(m_pWindow, ToRect(display)));
 }
 
-/// The window was as large as the display is now, which may be smaller than when it was entered.
+/// The display may have become smaller meanwhile: the window manager says so, or has made the
+/// window smaller with it.
+std::vector<Rect> SdlWindow::RoomBehindFullScreen() const {
+  const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
+  std::vector<Rect> room;
+  for (Rect display : UsableDisplays()) {
+    display = StillThere(m_pWindow, display.Intersection(CurrentRect()));
+    if (bar.y > 0 && bar.y <= kTitleBar * 2) display.top += bar.y;
+    if (!display.IsEmpty()) room.push_back(display);
+  }
+  return room;
+}
+
 void SdlWindow::LeaveFullScreen() {
   const Rect display = CurrentRect();
-  const Rect back = MovedOnto({display}, m_rcNormal);
+  const Rect back = MovedOnto(RoomBehindFullScreen(), m_rcNormal);
   if (!m_bFillsDisplay) SDL_SetWindowFullscreen(m_pWindow, 0);
   m_bFillsDisplay = false;
   if (m_bMaximizedBefore) {

@@ -47,11 +47,14 @@ class SdlWindow {
  private:
   bool Open(bool plain);
   void Close();
+  /// Is seen for the first time.
+  void Appear();
   Rect CurrentRect() const;
   void PutAt(const Rect& rect);
   bool IsFullScreen() const;
   /// In full screen: whether it was before.
   bool IsMaximized() const;
+  std::vector<Rect> RoomBehindFullScreen() const;
   void EnterFullScreen();
   void LeaveFullScreen();
   Size SizeInPixels() const;

@@ -120,6 +120,10 @@ void Put(const fs::path& file, toml::table& values, const std::string& entry, co
 /// error stream what could not be kept.
 bool Update(const fs::path& file, const std::string& section, const std::string& entry,
             const std::function<void(toml::table&)>& change) {
+  if (file.empty()) {
+    std::cerr << "The setting " << entry << " cannot be kept, as there is no home to keep it in.\n";
+    return false;
+  }
   std::error_code error;
   fs::create_directories(file.parent_path(), error);
   const CFileLock lock(LockOf(file));

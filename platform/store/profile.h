@@ -16,6 +16,7 @@ namespace platform {
 /// whatever happens; where it fails, the old file stays and the error stream says so.
 class CProfile {
  public:
+  /// An empty path keeps nothing: every value is absent.
   explicit CProfile(std::filesystem::path file);
 
   int GetInt(const std::string& section, const std::string& entry, int absent) const;

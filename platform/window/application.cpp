@@ -73,7 +73,9 @@ void CApplication::OnIdle() {
 }
 
 void CApplication::SetRegistryKey(const std::string& key) {
-  m_pProfile = std::make_unique<CProfile>(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
+  const std::filesystem::path folder = TheHost().ProfileFolder();
+  m_pProfile =
+      std::make_unique<CProfile>(folder.empty() ? folder : folder / key / (m_strName + ".toml"));
 }
 
 void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate) {
