@@ -76,7 +76,7 @@ class CProfile {
 };
 
 /// Opens the profile that this machine keeps in, or under the name of, a file. Neither the file nor
-/// its folder need exist.
+/// its folder need exist. An empty path keeps nothing.
 std::unique_ptr<CProfile> OpenProfile(const std::filesystem::path& file);
 
 }  // namespace platform

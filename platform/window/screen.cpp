@@ -47,13 +47,19 @@ void CScreen::PressAt(Point at) {
   pressed.OnLButtonDown(at - pressed.ScreenOrigin());
 }
 
-void CScreen::HoverAt(Point at) {
-  if (Top() == nullptr || !Top()->IsEnabled()) return;
+void CScreen::MoveTo(Point at) {
+  if (m_pPressed != nullptr) return m_pPressed->OnMouseMove(at - m_pPressed->ScreenOrigin());
+  if (!IsTopEnabled()) return;
   CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
   const Point origin = window.ScreenOrigin();
   window.OnMouseHover(at - origin);
   const ToolTip tip = window.TipAt(at - origin);
   TipFor({tip.text, tip.tool.Moved(origin)});
+}
+
+void CScreen::ReleaseAt(Point at) {
+  CWindow* pressed = std::exchange(m_pPressed, nullptr);
+  if (pressed != nullptr) pressed->OnLButtonUp(at - pressed->ScreenOrigin());
 }
 
 void CScreen::TipFor(const ToolTip& tip) {
@@ -65,44 +71,45 @@ void CScreen::DismissTip() {
 }
 
 void CScreen::HandleInput(const InputEvent& event) {
-  CTopWindow* top = Top();
   const bool moves =
       event.kind == InputKind::kPointerMove || event.kind == InputKind::kPointerLeave;
   if (!moves) DismissTip();
   switch (event.kind) {
     case InputKind::kPointerDown:
-      PressAt(event.at);
-      break;
+      return PressAt(event.at);
     case InputKind::kPointerMove:
-      if (m_pPressed == nullptr) {
-        HoverAt(event.at);
-      } else {
-        m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
-      }
-      break;
+      return MoveTo(event.at);
     case InputKind::kPointerUp:
-      if (CWindow* pressed = m_pPressed; pressed != nullptr) {
-        m_pPressed = nullptr;
-        pressed->OnLButtonUp(event.at - pressed->ScreenOrigin());
-      }
-      break;
+      return ReleaseAt(event.at);
+    case InputKind::kPointerLeave:
+      return TipFor({});
+    default:
+      if (IsTopEnabled()) HandleByTop(event);
+  }
+}
+
+void CScreen::HandleByTop(const InputEvent& event) {
+  CTopWindow& top = *Top();
+  CWindow& under = top.WindowAt(event.at - top.GetPlace().TopLeft());
+  switch (event.kind) {
     case InputKind::kWheel:
-      if (top != nullptr && top == WindowUnder(event.at) && top->IsEnabled()) {
-        top->WindowAt(event.at - top->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
+      if (WindowUnder(event.at) == &top) under.OnMouseWheel(event.wheel);
+      break;
+    case InputKind::kMiddleClick:
+      if (WindowUnder(event.at) == &top) {
+        under.OnMiddleClick(event.at - under.ScreenOrigin(), event.text);
       }
       break;
     case InputKind::kKey:
-      if (top != nullptr && top->IsEnabled()) top->RouteKey(event.stroke);
+      top.RouteKey(event.stroke);
       break;
     case InputKind::kText:
-      if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
+      top.RouteText(event.text);
       break;
-    case InputKind::kPointerLeave:
-      TipFor({});
-      break;
-    case InputKind::kMiddleClick:
     case InputKind::kComposition:
-    case InputKind::kClose:
+      top.RouteComposition(event.text);
+      break;
+    default:
       break;
   }
 }

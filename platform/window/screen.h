@@ -43,7 +43,11 @@ class CScreen {
 
  private:
   void PressAt(Point at);
-  void HoverAt(Point at);
+  void MoveTo(Point at);
+  void ReleaseAt(Point at);
+  bool IsTopEnabled() const { return Top() != nullptr && Top()->IsEnabled(); }
+  /// What the topmost window takes, and it alone.
+  void HandleByTop(const InputEvent& event);
   void TipFor(const ToolTip& tip);
   void DismissTip();
   /// Whoever has the pointer has it no more, without a release.

@@ -65,9 +65,13 @@ class CWindow {
   /// or another window opened.
   virtual void OnPressLost() {}
   virtual void OnMouseWheel(int) {}
+  /// The middle button went down on this window; the text is what is marked on the desktop.
+  virtual void OnMiddleClick(Point, const std::string&) {}
   /// Answers whether the key meant something here; otherwise the parent is asked.
   virtual bool OnKeyDown(const KeyStroke&) { return false; }
   virtual bool OnChar(const std::string&) { return false; }
+  /// What an input method has not finished yet, each time it changes; empty: it is done with it.
+  virtual bool OnComposition(const std::string&) { return false; }
   /// The keyboard has come here or gone.
   virtual void OnFocus(bool) { Invalidate(); }
 
