@@ -125,6 +125,13 @@ class Checker:
             if match := LIBRARY_NAME.search(line):
                 self.fault(path, number, f"may not use {match[0]}")
 
+    def check_usings(self, path, text):
+        """No file takes up a name that it has no use for. (clang-tidy sees the files of a folder as
+        one.)"""
+        for match in re.finditer(r"^using (?:\w+::)+(\w+);$", text, re.MULTILINE):
+            if len(re.findall(rf"\b{match[1]}\b", without_comments(text))) == 1:
+                self.fault(path, 1 + text.count("\n", 0, match.start()), f"has no use for {match[1]}")
+
     def check_game(self, path, text):
         """The layer knows no game, not even by name."""
         if path.startswith(PLATFORM) and (match := re.search("feltside", text, re.IGNORECASE)):
@@ -153,6 +160,7 @@ class Checker:
                 self.fault(path, 1, "lies in a folder that no rule names")
             self.check_includes(path, text)
             self.check_names(path, text)
+            self.check_usings(path, text)
             self.check_game(path, text)
             self.check_reach(path)
             if path.endswith(".h") and not re.search(r"^#pragma once$", text, re.MULTILINE):
