@@ -58,8 +58,8 @@ TEST_F(ProfileTest, TellsOfATroubleOnceUntilItIsOver) {
 }
 
 TEST_F(ProfileTest, LeavesTheFileThatCannotBeReadOrWritten) {
-  EXPECT_TRUE(Store("x", 1));
   for (bool* fails : {&g_bReadFails, &g_bFlushFails}) {
+    EXPECT_TRUE(Store("x", 1));
     *fails = true;
     EXPECT_EQ(GetInt("x"), fails == &g_bReadFails ? 7 : 1);
     EXPECT_FALSE(Store("y", 2));
