@@ -12,10 +12,19 @@
 
 using namespace feltside::tests;
 
-extern "C" ssize_t read(int descriptor, void* buffer, std::size_t size) {
-  if (!g_bReadFails) return syscall(SYS_read, descriptor, buffer, size);
+namespace {
+int Fail() {
   errno = EIO;
   return -1;
+}
+}  // namespace
+
+extern "C" ssize_t read(int descriptor, void* buffer, std::size_t size) {
+  return g_bReadFails ? Fail() : syscall(SYS_read, descriptor, buffer, size);
+}
+
+extern "C" int fsync(int descriptor) {
+  return g_bFlushFails ? Fail() : static_cast<int>(syscall(SYS_fsync, descriptor));
 }
 
 extern "C" int usleep(useconds_t microseconds) {

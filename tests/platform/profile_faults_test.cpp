@@ -57,18 +57,24 @@ TEST_F(ProfileTest, TellsOfATroubleOnceUntilItIsOver) {
   EXPECT_EQ(m_pProfile->TakeTroubles(), troubles);
 }
 
-TEST_F(ProfileTest, TakesAReadErrorForNoEmptyFile) {
-  EXPECT_TRUE(Store("x", 1));
-  g_bReadFails = true;
-  EXPECT_EQ(GetInt("x"), 7);
-  EXPECT_EQ(m_pProfile->TakeTroubles().size(), 1U);
-  EXPECT_FALSE(Store("y", 2));
-  g_bReadFails = false;
-  EXPECT_EQ(GetInt("x"), 1);
+TEST_F(ProfileTest, LeavesTheFileThatCannotBeReadOrWritten) {
+  for (bool* fails : {&g_bReadFails, &g_bFlushFails}) {
+    EXPECT_TRUE(Store("x", 1));
+    *fails = true;
+    EXPECT_EQ(GetInt("x"), fails == &g_bReadFails ? 7 : 1);
+    EXPECT_FALSE(Store("y", 2));
+    *fails = false;
+    EXPECT_FALSE(m_pProfile->TakeTroubles().empty());
+    EXPECT_EQ(ReadFile(m_file), "[S]\nx = 1\n");
+    EXPECT_FALSE(exists(fs::path(m_file) += ".new"));
+  }
 }
 
 TEST_F(ProfileTest, StoresAllOrNothingWhenMemoryRunsOut) {
-  const std::string before = "[S]\nname = \"" + std::string(100, 'n') + "\"\nx = 1\n";
+  // A stream takes memory for 512 letters first, and so many end here at the end of a line.
+  std::string before = "[S]\naaaaaaa = 1\n";
+  for (int i = 10; i < 99; ++i) before += "k" + std::to_string(i) + " = 1\n";
+  before += "x = 1\n";
   bool stored = false;
   for (int allocations = 1; !stored; ++allocations) {
     WriteFile(m_file, before);
@@ -83,6 +89,15 @@ TEST_F(ProfileTest, StoresAllOrNothingWhenMemoryRunsOut) {
     ASSERT_EQ(ReadFile(m_file), stored ? before + "y = 2\n" : before) << allocations;
   }
   EXPECT_TRUE(KeptCopies().empty());
+  // Also where the parser has something to say.
+  for (int allocations = 1; allocations < 200; ++allocations) {
+    fs::remove(Kept(1));
+    WriteFile(m_file, "[S");
+    g_nAllocationsLeft = allocations;
+    EXPECT_EQ(GetInt("x"), 7);
+    g_nAllocationsLeft = 0;
+    EXPECT_EQ(ReadFile(exists(m_file) ? m_file : Kept(1)), "[S");
+  }
 }
 
 class LongNameTest : public ProfileTest {

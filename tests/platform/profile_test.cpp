@@ -12,6 +12,7 @@
 namespace feltside::tests {
 namespace {
 
+namespace fs = std::filesystem;
 using testing::ElementsAre;
 
 TEST_F(ProfileTest, BringsIntegersBack) {
@@ -57,7 +58,11 @@ TEST_F(ProfileTest, KeepsWhatElseStandsInTheFile) {
   WriteFile(m_file,
             "above = 1\n[[List]]\nx = 1\n[Other]\n\"O'Brien\" = [nan, -inf, 0.001, {a.b = 1}]\n"
             "when = 1979-05-27T07:32:00Z\n[Other.\"\xC3\xA9\"]\ne = {}\n[S]\nfirst = 1\n");
+  constexpr auto kPermissions =
+      fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read;
+  fs::permissions(m_file, kPermissions);
   EXPECT_TRUE(Store("second", 2));
+  EXPECT_EQ(fs::status(m_file).permissions(), kPermissions);
   EXPECT_EQ(ReadFile(m_file),
             "List = [ { x = 1 } ]\nabove = 1\n[Other]\n"
             "\"O'Brien\" = [ nan, -inf, 0.001, { a = { b = 1 } } ]\nwhen = 1979-05-27T07:32:00Z\n"
@@ -93,7 +98,7 @@ TEST_F(ProfileTest, SetsADamagedFileAside) {
       "x = [\n1.\"\xC3\xA9\"]", "x = \"\"\"\\\n  \xC3\xA9\"\"\"", "x = \"\"\"\\\xC3\xA9\"\"\"",
       // So deep that a stack would not hold it, and so long that nobody has written it.
       "a" + Repeated(".a", 200000) + " = 1", "[a" + Repeated(" . \"a\"", 100000) + "]",
-      "x = " + Repeated("[", 100000), "x = " + Repeated("{a = ", 100000),
+      "x = " + Repeated("[", 65) + Repeated("]", 65), "x = " + Repeated("{a = ", 100000),
       "[S]\nx = 5\n" + Repeated("# a comment\n", 100000)};
   for (std::size_t i = 0; i < damaged.size(); ++i) {
     WriteFile(m_file, damaged[i]);
