@@ -17,7 +17,8 @@ enum Advice {
 
 /// The basic-strategy move for this hand against the dealer's up card, as one of the codes above;
 /// strText receives the move in words. Where the strategy has nothing to say (a lone ace, no up
-/// card) the code is ADVICE_NONE and strText stays as it was.
+/// card) the code is ADVICE_NONE and strText stays as it was. An empty hand is told to hit, and a
+/// pair to split even where no split is left to make.
 int GetAdvice(const CBlackjackHand& hand, std::string& strText, int upCard);
 
 }  // namespace feltside

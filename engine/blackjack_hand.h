@@ -13,7 +13,7 @@ class CBlackjackHand : public CCardHand {
   CBlackjackHand() { SetLimit(5); }
 
   /// The hand's total with one ace raised to 11 where that does not bust; 0 for an empty hand. Not
-  /// capped: a busted hand gives more than 21.
+  /// capped: it is more than 21 for a busted hand.
   int GetTotal() const;
 
   /// 1 if the hand is exactly two cards of one rank, else 0. A jack and a king are no pair.

@@ -15,14 +15,14 @@ inline constexpr int kNoCard = -1;  ///< what an empty slot holds
 inline constexpr int kAce = 1;
 inline constexpr int kKing = 13;
 
-// Suit numbers, as GetSuit of a hand gives them.
+// Suit numbers, as GetSuit of a hand returns them.
 inline constexpr int kSuits = 4;
 inline constexpr int kNoSuit = 4;  ///< of anything that is not a card
 
 constexpr bool IsCard(int card) { return card >= 1 && card <= kDeckSize; }
 
-/// 1 (ace, always low) to 13 (king). Only a card has a rank worth asking for; other numbers give
-/// some number not above 13.
+/// 1 (ace, always low) to 13 (king). Only a card has a rank worth asking for; of other numbers it
+/// returns some number not above 13.
 constexpr int RankOf(int card) {
   const int remainder = card % kRanks;
   return remainder == 0 ? kKing : remainder;

@@ -11,7 +11,7 @@ namespace feltside {
 /// freely.
 class CCardHand {
  public:
-  static constexpr int kSlots = 27;
+  static constexpr int kSlots = 27;  ///< no limit is higher
 
   CCardHand() { Clear(); }
 

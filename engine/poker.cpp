@@ -9,7 +9,7 @@ namespace {
 
 // All tests take a hand that is sorted upwards by rank, in which an ace stands first.
 
-constexpr int kFullHand = 5;  // cards in a straight or a flush
+constexpr int kHandSize = 5;  // cards in a straight or a flush
 
 int RankAt(const CCardHand& sorted, int slot) { return RankOf(sorted.GetCard(slot)); }
 
@@ -47,13 +47,13 @@ RankRun LongestRankRun(const CCardHand& sorted) {
   return LongerRun(best, run);
 }
 
-bool IsStraight(const CCardHand& sorted) { return LongestRankRun(sorted).length >= kFullHand; }
+bool IsStraight(const CCardHand& sorted) { return LongestRankRun(sorted).length >= kHandSize; }
 
 // The cards of the straight, from the lowest up; none if there is no straight.
 CCardHand CollectStraight(const CCardHand& sorted) {
   CCardHand straight;
   const RankRun run = LongestRankRun(sorted);
-  if (run.length < kFullHand) {
+  if (run.length < kHandSize) {
     return straight;
   }
   straight.SetLimit(sorted.GetLimit());
@@ -77,7 +77,7 @@ bool IsFlush(const CCardHand& hand) {
   for (int slot = 0; slot < hand.GetCount(); ++slot) {
     ++count[static_cast<std::size_t>(CCardHand::GetSuit(hand.GetCard(slot)))];
   }
-  return *std::max_element(count.begin(), count.begin() + kSuits) + count[kNoSuit] >= kFullHand;
+  return *std::max_element(count.begin(), count.begin() + kSuits) + count[kNoSuit] >= kHandSize;
 }
 
 bool IsStraightFlush(const CCardHand& sorted) { return IsFlush(CollectStraight(sorted)); }

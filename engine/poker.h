@@ -42,7 +42,8 @@ inline constexpr std::array<PokerReturn, 10> kPokerReturns = {{
     {"Royal Flush", 250},
 }};
 
-/// The best category that the hand's cards make, 0 to 9. The hand may be in any order.
+/// The best category that the hand's cards make, 0 to 9. The hand may be in any order and of any
+/// size; a number in it that is not a card goes with every suit.
 int EvaluatePoker(const CCardHand& hand);
 
 /// Puts the name of the hand's category into strName and returns its dollars.

@@ -46,7 +46,7 @@ int CShoe::TakeCard() {
   return m_nNext < m_nCount ? m_nCard[static_cast<std::size_t>(m_nNext++)] : kNoCard;
 }
 
-void CShoe::SetAside(const CCardHand& hand) {
+void CShoe::TakeOut(const CCardHand& hand) {
   for (int slot = 0; slot < hand.GetCount(); ++slot) {
     const auto next = m_nCard.begin() + m_nNext;
     const auto found = std::find(next, m_nCard.end(), hand.GetCard(slot));

@@ -19,16 +19,18 @@ class CShoe {
   void Fill();
 
   /// Fills, then shuffles with a seed from the clock and the number of shuffles so far, so that two
-  /// shuffles within one second differ. Reads the clock of the host.
+  /// shuffles within one second differ. Reads the clock of the host, and seeds the one generator of
+  /// the process.
   void Shuffle();
 
-  /// Deals the next card. An exhausted shoe gives kNoCard and stays exhausted, as does one that was
-  /// never filled.
+  /// Deals the next card. An exhausted shoe returns kNoCard and stays exhausted; so does one that
+  /// was never filled, for every card.
   int TakeCard();
 
-  /// After a shuffle in the midst of a deal: the cards of a hand, which lie on the table, are dealt
-  /// already and do not come again. A card that the shoe has no more of is passed over.
-  void SetAside(const CCardHand& hand);
+  /// After a shuffle in the midst of a deal: takes the cards of a hand, which lie on the table, out
+  /// of those still to come, as if they had just been dealt. A card that the shoe has no more of is
+  /// passed over.
+  void TakeOut(const CCardHand& hand);
 
   /// Whether so few cards are left that a deal goes on with them rather than with a fresh shuffle.
   bool IsNearEnd() const { return m_nCount - m_nNext <= kReserve; }
@@ -46,8 +48,10 @@ class CShoe {
   explicit CShoe(int decks);
 
  private:
-  static constexpr int kReserve = 15;
+  static constexpr int kReserve = 15;  // cards
 
+  /// A message box for each slot that holds no card. After a fill there is none; a faulty one would
+  /// otherwise show only in play.
   void CheckCards() const;
 
   std::vector<int> m_nCard;  // m_nCount slots, kNoCard until the first fill

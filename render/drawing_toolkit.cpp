@@ -1,6 +1,5 @@
 // What every drawing of the table is put together from: cards, labels, hand texts and pictures.
 
-#include "platform/window/application.h"
 #include "render/table_layout.h"
 
 namespace feltside {
@@ -14,13 +13,14 @@ constexpr int kTextGap = 10;  ///< between a fan and the text beside it
 }  // namespace
 
 using platform::Point;
+using platform::Rect;
 using platform::Size;
 
 void CTableLayout::DrawCard(int position, int slot, int bitmapID) const {
   if (position == -1 || slot == -1 || bitmapID < 1 || bitmapID > kLastCardBackID) return;
   const Size card{m_nCardWidth, m_nCardHeight};
-  const platform::CBitmap& picture = platform::TheApp().Resources().LoadBitmap(bitmapID, card);
-  m_pDC->StretchBlt(RectAt(CardCorner(position, slot), card), picture, RectAt({}, card));
+  const platform::CBitmap& picture = m_pPictures->LoadBitmap(bitmapID, card);
+  m_pDC->StretchBlt(CardRect(position, slot), picture, RectAt({}, card));
 }
 
 void CTableLayout::DrawHand(int position, CCardHand hand) const {
@@ -76,9 +76,13 @@ void CTableLayout::DrawHandText(int position, const std::string& text, bool bold
   m_pDC->SetTextColor(previousColor);
 }
 
-void CTableLayout::CopyPicture(Point at, Size size, int bitmapID, platform::RasterOp op) const {
-  const platform::CBitmap& picture = platform::TheApp().Resources().LoadBitmap(bitmapID, size);
-  m_pDC->BitBlt(at, size, picture, {}, op);
+void CTableLayout::DrawPicture(const Rect& place, int bitmapID, platform::RasterOp op) const {
+  const Size size{place.Width(), place.Height()};
+  m_pDC->BitBlt(place.TopLeft(), size, m_pPictures->LoadBitmap(bitmapID, size), {}, op);
+}
+
+void CTableLayout::DrawIcon(const Rect& place, int iconID) const {
+  m_pDC->DrawIcon(place.TopLeft(), m_pPictures->LoadIcon(iconID, {place.Width(), place.Height()}));
 }
 
 }  // namespace feltside

@@ -19,7 +19,6 @@ void LoadOnce(std::unique_ptr<platform::CBitmap>& picture, int bitmapID, platfor
 using platform::CSurface;
 using platform::Rect;
 
-/// The paint covers every pixel itself, so nothing is to be cleared before it.
 bool CFeltsideView::OnEraseBkgnd(CSurface&) { return true; }
 
 void CFeltsideView::OnDraw(CSurface& surface) {
@@ -50,7 +49,7 @@ void CFeltsideView::DrawTable(CSurface& surface) {
   m_layout.Prepare(frame, client);
   if (m_nGameType == kGameBlackjack) {
     DrawBlackjackTable();
-  } else if (m_nGameType == kGameVideoPoker) {
+  } else {
     DrawVideoPokerTable(frame);
   }
   m_layout.Release();

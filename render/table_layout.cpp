@@ -88,6 +88,10 @@ Rect CTableLayout::GetPosRect(int position) const {
   return RectAt(CardCorner(position, 0), size);
 }
 
+Rect CTableLayout::CardRect(int position, int slot) const {
+  return RectAt(CardCorner(position, slot), {m_nCardWidth, m_nCardHeight});
+}
+
 Point CTableLayout::CardCorner(int position, int slot) const {
   Point corner;
   GetCardPos(corner.x, corner.y, position, slot);

@@ -3,7 +3,7 @@
 #include <array>
 
 #include "engine/poker.h"
-#include "render/number_text.h"
+#include "render/money_text.h"
 #include "render/table_layout.h"
 
 namespace feltside {
@@ -29,7 +29,6 @@ constexpr std::array<PayRow, 4> kPayRows = {{{POKER_ROYAL_FLUSH, POKER_FLUSH},
 }  // namespace
 
 using platform::Point;
-using platform::Rect;
 
 void CTableLayout::DrawPayTable() const {
   const platform::SavedState saved(*m_pDC);
@@ -57,15 +56,10 @@ void CTableLayout::DrawPayRow(int row, int rowHeight, int numberWidth) const {
   m_pDC->TextOut({m_rcTable.right - 3 - numberWidth, y}, std::to_string(right.dollars));
 }
 
-Rect CTableLayout::PlayButtonRect() const {
-  const int top = CardCorner(POS_MIDDLE_ROW, 0).y + m_nCardHeight + 10;
-  return {Center().x - 30, top, Center().x + 30, top + 40};
-}
-
 void CTableLayout::DrawPlayButton(bool deal) const {
   const platform::SavedState saved(*m_pDC);
   const std::string text = deal ? "Deal" : "Play";
-  const Rect button = PlayButtonRect();
+  const platform::Rect button = DealButtonRect();
   m_pDC->SetFont(kButtonFont);
   const platform::Size extent = m_pDC->TextExtent(text);
   m_pDC->SetBrush(kButtonColor);
@@ -80,7 +74,7 @@ void CTableLayout::DrawPlayButton(bool deal) const {
 void CTableLayout::DrawAmount(int position, int dollars) const {
   const platform::Font previous = m_pDC->SetFont(kPayFont);
   const platform::Color previousColor = m_pDC->SetTextColor(kAmountColor);
-  const std::string text = NumberText("$%d", dollars);
+  const std::string text = MoneyText(dollars, 0);
   const platform::Size extent = m_pDC->TextExtent(text);
   const Point at = CardCorner(position, 0);
   TextOnTable({at.x - extent.width - 10, at.y - 2 * extent.height - 3 + m_nCardHeight}, text);

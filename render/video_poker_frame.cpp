@@ -2,7 +2,7 @@
 
 #include <cmath>
 
-#include "render/number_text.h"
+#include "render/money_text.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -52,7 +52,7 @@ void CFeltsideView::DrawFancyPokerTexts(platform::CSurface& surface) {
   surface.TextOut(kButtonTextAt, m_bHandInProgress == 0 ? "Deal" : "Play");
   surface.SetBackColor(kWalletCell);
   // Halves always go up, so that every deal shows a dollar less.
-  surface.TextOut(kWalletTextAt, NumberText("$%.0f", std::floor(m_dWallet + 0.5)));
+  surface.TextOut(kWalletTextAt, MoneyText(std::floor(m_dWallet + 0.5), 0));
   surface.SetBackColor(kResultCell);
   surface.SetTextColor(kResultColor);
   surface.TextOut(kResultTextAt, m_strPlayerMsg);

@@ -114,7 +114,8 @@ CStylus::Json CStylus::State() {
     for (const auto& control : dialog->Controls()) state["controls"].push_back(ToJson(*control));
     state["focus"] = FocusOf(*dialog);
   }
-  state["typing"] = m_host.WantsText();
+  state["typing"] = m_host.TextPlace().has_value();
+  state["tip"] = m_app.Screen().TipText();
   state["helps"] = m_host.HelpCalls();
   state["running"] = true;
   return state;

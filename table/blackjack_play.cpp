@@ -56,7 +56,6 @@ void CFeltsideView::AnswerInsurance(int taken) {
   ResolveInsurance();
 }
 
-/// Insurance always costs half the stake; against a dealer's natural that is all the deal costs.
 void CFeltsideView::ResolveInsurance() {
   if (m_handDealer.GetTotal() == kTwentyOne) {
     m_strPlayerMsg = "Dealer Wins!";

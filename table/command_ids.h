@@ -2,7 +2,8 @@
 
 namespace feltside {
 
-// The game's commands. New, Open, About and Exit are the framework's.
+// The game's commands. New, Open, About and Exit are the framework's. The numbers stay as they are:
+// scripts name commands by them.
 inline constexpr int kCommandHit = 32771;
 inline constexpr int kCommandStand = 32772;
 inline constexpr int kCommandSplit = 32773;

@@ -57,7 +57,9 @@ bool CFeltsideView::KeyMark(char key) {
 bool CFeltsideView::KeyTableButton(char key) {
   if (m_bInsuranceOffered != 0 && (key == 'I' || key == 'N')) {
     AnswerInsurance(key == 'I' ? 1 : 0);
-  } else if (m_bHandInProgress == 0 && key == '+') {
+    return true;
+  }
+  if (m_bHandInProgress == 0 && key == '+') {
     RaiseBet();
   } else if (m_bHandInProgress == 0 && key == '-') {
     LowerBet();

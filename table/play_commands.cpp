@@ -35,7 +35,6 @@ bool CFeltsideView::CanStand() const {
   return m_nGameType == kGameBlackjack && m_bHandInProgress != 0 && m_bInsuranceOffered == 0;
 }
 
-/// A full hand could only lose the card, and enough lost cards would empty the shoe.
 bool CFeltsideView::CanHit() const {
   return CanStand() && ActiveHand().GetCount() < ActiveHand().GetLimit();
 }

@@ -3,12 +3,6 @@
 #include "table/feltside_view.h"
 
 namespace feltside {
-namespace {
-
-/// The button that the video-poker picture shows; it stays where it is whatever the client size.
-constexpr platform::Rect kFancyDealButton{70, 180, 155, 215};
-
-}  // namespace
 
 using platform::Point;
 
@@ -26,7 +20,7 @@ void CFeltsideView::TapBlackjack(Point p) {
     Repaint();
   }
   if (m_bInsuranceOffered == 0 && m_bHandInProgress != 0) return;
-  // The targets below are placed by a measured text, so the layout needs a surface to measure on.
+  // The stake can be changed before any frame has placed the table.
   platform::CBitmap nothing;
   platform::CSurface surface(nothing);
   m_layout.Prepare(surface, GetClientRect());
@@ -38,7 +32,6 @@ void CFeltsideView::TapBlackjack(Point p) {
   m_layout.Release();
 }
 
-/// Before the first table frame nothing stands on the table that could be hit.
 bool CFeltsideView::IsStrategyButtonLive() const {
   return m_bShowTitle == 0 && m_nStrategyMode == kStrategyButton && m_bShowAdvice == 0;
 }
@@ -51,7 +44,6 @@ void CFeltsideView::TapInsurance(Point p) {
   }
 }
 
-/// The two buttons' areas overlap by a few columns; a tap there lowers and then raises.
 void CFeltsideView::TapStake(Point p) {
   if (m_layout.HitBetDown(p) != 0) LowerBet();
   if (m_layout.HitBetUp(p) != 0) RaiseBet();
@@ -72,7 +64,7 @@ void CFeltsideView::TapVideoPoker(Point p) {
 }
 
 bool CFeltsideView::IsOnDealButton(Point p) const {
-  if (m_bFancyPoker != 0) return kFancyDealButton.Contains(p);
+  if (m_bFancyPoker != 0) return CTableLayout::kFancyDealButton.Contains(p);
   return m_bShowTitle == 0 && m_layout.HitDealButton(p) != 0;
 }
 

@@ -10,7 +10,8 @@ namespace feltside {
 namespace {
 
 constexpr double kStake = 1.0;
-/// A deal takes at most ten cards, so every deal finds a deck that has been dealt from shuffled.
+/// A deal takes at most ten cards, so the next one shuffles the deck again; but what blackjack has
+/// left of it after taking eleven or more is dealt to its end.
 constexpr int kReshuffleBelow = 11;
 
 }  // namespace
@@ -26,6 +27,7 @@ void CFeltsideView::DealVideoPoker() {
   m_handPoker.Clear();
   for (int i = 0; i < kPokerCards; ++i) {
     const int card = DrawFrom(m_deck1, {&m_handPoker});
+    // Never so with a whole deck; a faulty one is to be seen.
     if (!IsCard(card)) platform::MessageBox(std::to_string(card) + " is being put in!");
     m_handPoker.AddCard(card);
   }

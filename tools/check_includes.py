@@ -38,7 +38,7 @@ OURS = [
 ]
 
 SDL = r"SDL.*"
-SYSTEM = r"(sys/\w+|fcntl|unistd|signal|poll|errno|dirent)\.h"
+SYSTEM = r"(sys/\w+|fcntl|unistd|pwd|signal|poll|errno|dirent)\.h"
 GTEST = r"g(test|mock)/g(test|mock).*\.h"
 JSON = r"nlohmann/.*"
 
@@ -49,6 +49,7 @@ LIBRARIES = [
     (r"platform/host/\w+\.cpp", f"{SDL}|malloc\\.h|{SYSTEM}"),
     (r"platform/store/\w+\.cpp", rf"toml\+\+/.*|{SYSTEM}"),
     (r"stylus/.*", JSON),
+    (r"tests/platform/sdl_\w+\.cpp", SDL),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|dlfcn\\.h"),
     (r"fuzz/.*", SYSTEM),
@@ -117,11 +118,19 @@ class Checker:
     def check_names(self, path, text):
         """Even by name the libraries are known to the layer alone, and to what the game is measured
         against."""
-        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|bench/\w+\.cpp", path):
+        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|(bench/|tests/platform/sdl_)\w+\.cpp",
+                        path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
             if match := LIBRARY_NAME.search(line):
                 self.fault(path, number, f"may not use {match[0]}")
+
+    def check_usings(self, path, text):
+        """No file takes up a name that it has no use for. (clang-tidy sees the files of a folder as
+        one.)"""
+        for match in re.finditer(r"^using (?:\w+::)+(\w+);$", text, re.MULTILINE):
+            if len(re.findall(rf"\b{match[1]}\b", without_comments(text))) == 1:
+                self.fault(path, 1 + text.count("\n", 0, match.start()), f"has no use for {match[1]}")
 
     def check_game(self, path, text):
         """The layer knows no game, not even by name."""
@@ -151,6 +160,7 @@ class Checker:
                 self.fault(path, 1, "lies in a folder that no rule names")
             self.check_includes(path, text)
             self.check_names(path, text)
+            self.check_usings(path, text)
             self.check_game(path, text)
             self.check_reach(path)
             if path.endswith(".h") and not re.search(r"^#pragma once$", text, re.MULTILINE):

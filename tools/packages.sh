@@ -1,33 +1,59 @@
-# The packages that Feltside needs, in one place for `play` and `check`.
-#
-# Each line: the Debian package, and how to see on any other system that what it brings is there:
-#   command NAME   a program in the path
-#   module NAME    a module that pkg-config knows
-#   font NAME      a font file where the build looks for it
-#   python NAME    a module that python3 can import
-#   helper NAME    a program that the game starts where there is one, and does without elsewhere
+# What to install, read from where it stands: debian/control. Sourced by bash at the top folder of the
+# project.
 
-play_packages='
-  cmake                command  cmake
-  ninja-build          command  ninja
-  g++                  command  c++
-  pkg-config           command  pkg-config
-  libsdl2-dev          module   sdl2
-  libfreetype-dev      module   freetype2
-  libpng-dev           module   libpng
-  libtomlplusplus-dev  module   tomlplusplus
-  nlohmann-json3-dev   module   nlohmann_json
-  fonts-liberation     font     LiberationSans-Regular.ttf
-  xdg-utils            helper   xdg-open
-'
+# packages PROFILE...: the packages that are needed with these build profiles, and by the game itself.
+packages() {
+  awk -v profiles=" $* " '
+    /^[^ ]/ { in_list = /^(Build-)?Depends:/ }
+    in_list && /^ [^$]/ {
+      gsub(/[<>,]|\([^)]*\)/, " ")
+      for (i = 2; i <= NF; i++) {
+        name = $i
+        wanted = sub(/^!/, "", name) ? 0 : 1
+        if ((index(profiles, " " name " ") > 0) != wanted) next
+      }
+      print $1
+    }' debian/control
+}
 
-check_packages="$play_packages"'
-  clang                command  clang++
-  clang-tidy           command  clang-tidy
-  clang-format         command  clang-format
-  libgtest-dev         module   gtest
-  libgmock-dev         module   gmock
-  tidy                 command  tidy
-  python3              command  python3
-  python3-pil          python   PIL
-'
+# absent_packages PACKAGE...: those that dpkg does not have.
+absent_packages() {
+  local installed
+  installed=$(dpkg-query -W -f '${db:Status-Status} ${Package}\n' "$@" 2>/dev/null |
+    awk '$1 == "installed" { print $2 }')
+  printf '%s\n' "$@" | grep -vxF -e "$installed"
+}
+
+# install_packages LOG PACKAGE...: as root, or through sudo, which may ask for a password.
+install_packages() {
+  local log=$1 as_root=()
+  shift
+  [ "$(id -u)" = 0 ] || as_root=(sudo)
+  say "installing $* (log: $log)"
+  # Lists that cannot be renewed may still do.
+  "${as_root[@]}" apt-get update >"$log" 2>&1
+  "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get install -y --no-install-recommends \
+    -o DPkg::Lock::Timeout=120 "$@" >>"$log" 2>&1
+}
+
+# require_packages LOG PROFILE...: installs what is missing of the packages for these profiles. Where
+# that cannot be done they are named, and it is left to the build to say what it does not find.
+require_packages() {
+  local log=$1 needed absent why
+  shift
+  mapfile -t needed < <(packages "$@")
+  if ! command -v dpkg-query >/dev/null || ! command -v apt-get >/dev/null; then
+    say "this system has no apt-get; needed are, by their Debian names: ${needed[*]}"
+    return
+  fi
+  mapfile -t absent < <(absent_packages "${needed[@]}")
+  [ ${#absent[@]} != 0 ] || return 0
+  if [ "$(id -u)" != 0 ] && ! command -v sudo >/dev/null; then
+    why='installing takes root or sudo'
+  elif install_packages "$log" "${absent[@]}"; then
+    return 0
+  else
+    why="installing failed (see $log)"
+  fi
+  say "$why; not installed are ${absent[*]}; going on with what is here"
+}

@@ -39,7 +39,7 @@ struct Rect {
   }
   constexpr Rect Shrunk(int by) const { return {left + by, top + by, right - by, bottom - by}; }
   /// The part that both cover; empty where they do not meet.
-  constexpr Rect Common(const Rect& other) const {
+  constexpr Rect Intersection(const Rect& other) const {
     return {left > other.left ? left : other.left, top > other.top ? top : other.top,
             right < other.right ? right : other.right,
             bottom < other.bottom ? bottom : other.bottom};

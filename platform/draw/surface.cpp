@@ -14,7 +14,7 @@ CSurface::CSurface(CBitmap& target) : CSurface(target, target.Bounds()) {}
 CSurface::CSurface(CBitmap& target, const Rect& part) : m_pTarget(&target), m_part(part) {}
 
 CSurface::CSurface(const CSurface& whole, const Rect& part)
-    : CSurface(*whole.m_pTarget, part.Moved(whole.m_part.TopLeft()).Common(whole.m_part)) {}
+    : CSurface(*whole.m_pTarget, part.Moved(whole.m_part.TopLeft()).Intersection(whole.m_part)) {}
 
 Font CSurface::SetFont(const Font& font) { return std::exchange(m_state.font, font); }
 Color CSurface::SetTextColor(Color color) { return std::exchange(m_state.textColor, color); }
@@ -24,7 +24,7 @@ Color CSurface::SetBrush(Color color) { return std::exchange(m_state.brush, colo
 Color CSurface::SetPen(Color color) { return std::exchange(m_state.pen, color); }
 
 Rect CSurface::Visible(const Rect& rect) const {
-  return rect.Moved(m_part.TopLeft()).Common(m_part).Common(m_pTarget->Bounds());
+  return rect.Moved(m_part.TopLeft()).Intersection(m_part).Intersection(m_pTarget->Bounds());
 }
 
 /// Calls the rule with each pixel of the rectangle that the target has, and its place on this
@@ -64,7 +64,7 @@ void CSurface::Line(Point from, Point to) {
 
 void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt, RasterOp op) {
   const Point shift = at - sourceAt;
-  const Rect visible = Visible(RectAt(at, size).Common(source.Bounds().Moved(shift)));
+  const Rect visible = Visible(RectAt(at, size).Intersection(source.Bounds().Moved(shift)));
   if (visible.IsEmpty()) return;
   const Point toSource = Point{} - shift - m_part.TopLeft();
   for (int y = visible.top; y < visible.bottom; ++y) {
@@ -114,7 +114,7 @@ void CSurface::TextOut(Point at, const std::string& text) {
 void CSurface::DrawText(const Rect& rect, const std::string& text, TextAlign align) {
   const int spare = rect.Width() - TextExtent(text).width;
   const int indent = align == TextAlign::kLeft ? 0 : align == TextAlign::kRight ? spare : spare / 2;
-  CSurface line(*m_pTarget, rect.Moved(m_part.TopLeft()).Common(m_part));
+  CSurface line(*m_pTarget, rect.Moved(m_part.TopLeft()).Intersection(m_part));
   line.m_state = m_state;
   line.TextOut(Point{rect.left + indent, rect.top} + m_part.TopLeft() - line.m_part.TopLeft(),
                text);

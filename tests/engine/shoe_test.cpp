@@ -65,14 +65,14 @@ TYPED_TEST(ShoeTest, IsNearItsEndWithFifteenCardsLeft) {
   EXPECT_TRUE(shoe.IsNearEnd());
 }
 
-TYPED_TEST(ShoeTest, SetsTheCardsOfAHandAside) {
+TYPED_TEST(ShoeTest, TakesTheCardsOfAHandOut) {
   TypeParam shoe;
   shoe.Shuffle();
   const int eights = shoe.GetCount() / 52;
   CCardHand hand;
   hand.SetLimit(10);
   for (int i = 0; i < eights + 2; ++i) hand.AddCard(8);  // two more than there are
-  shoe.SetAside(hand);
+  shoe.TakeOut(hand);
   EXPECT_EQ(shoe.GetPosition(), eights);
   EXPECT_THAT(TakeAll(shoe), testing::AllOf(testing::SizeIs(shoe.GetCount() - eights),
                                             testing::Not(testing::Contains(8))));

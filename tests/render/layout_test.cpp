@@ -6,7 +6,7 @@
 #include <utility>
 
 #include "render/table_layout.h"
-#include "shell/feltside_app.h"
+#include "shell/res/pictures.h"
 #include "tests/support/golden.h"
 
 namespace feltside::tests {
@@ -58,7 +58,8 @@ class TableLayoutTest : public testing::TestWithParam<Area> {
 
   platform::CBitmap m_nothing;
   platform::CSurface m_surface{m_nothing};
-  CTableLayout m_layout;
+  platform::CResources m_pictures{PictureFiles()};
+  CTableLayout m_layout{m_pictures};
 };
 
 TEST_P(TableLayoutTest, PlacesCards) {
@@ -108,7 +109,6 @@ TEST_P(TableLayoutTest, FindsTheCardUnderAPoint) {
 
 /// Everything that is placed by the client area, on a sheet of its size.
 TEST_P(TableLayoutTest, DrawsInAnyClientArea) {
-  const CFeltsideApp app;
   const Rect client = GetParam().client;
   platform::CBitmap sheet({client.right, client.bottom}, platform::Rgb(0, 155, 0));
   platform::CSurface surface(sheet);
@@ -134,6 +134,18 @@ TEST_P(TableLayoutTest, DrawsInAnyClientArea) {
   layout.DrawCard(POS_BOTTOM, -1, 27);
   layout.DrawCard(POS_BOTTOM, 4, 65);
   ExpectGolden(sheet, "layout_" + std::to_string(client.right));
+}
+
+TEST(TableLayout, HasNothingToHitBeforeItIsPrepared) {
+  platform::CResources none({nullptr, 0});
+  CTableLayout layout(none);
+  layout.m_nRowCards = 5;
+  for (int y = -99; y < 99; ++y) {
+    for (int x = -99; x < 99; ++x) {
+      for (const auto hitTest : kHitTests) ASSERT_EQ((layout.*hitTest)({x, y}), 0);
+      ASSERT_EQ(layout.HitTestCard({x, y}), -1);
+    }
+  }
 }
 
 INSTANTIATE_TEST_SUITE_P(Areas, TableLayoutTest, testing::ValuesIn(kAreas));

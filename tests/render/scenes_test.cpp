@@ -8,7 +8,7 @@
 
 #include "platform/draw/look.h"
 #include "platform/draw/wrapped_text.h"
-#include "render/number_text.h"
+#include "render/money_text.h"
 #include "tests/render/contrast.h"
 #include "tests/render/table_styles.h"
 #include "tests/support/golden.h"
@@ -43,8 +43,8 @@ std::vector<Style> StylesOn(bool felt) {
 }
 
 Texts BlackjackTexts(const Json& state) {
-  Texts texts = {"Dealer", "Player", NumberText("Wallet: $%.2f", state["m_dWallet"].get<double>()),
-                 NumberText("Current Bet: $%d", state["m_nBet"].get<int>())};
+  Texts texts = {"Dealer", "Player", "Wallet: " + MoneyText(state["m_dWallet"], 2),
+                 "Current Bet: " + MoneyText(state["m_nBet"], 0)};
   if (state["m_handSplit"].empty()) texts.push_back("You");
   for (const char* member : {"m_strPlayerScore", "m_strPlayerMsg", "m_strSplitScore",
                              "m_strSplitMsg", "m_strDealerScore"}) {
@@ -57,7 +57,7 @@ Texts PokerTexts(const Json& state) {
   const double wallet = state["m_dWallet"];
   Texts texts = {state["m_bHandInProgress"] == 0 ? "Deal" : "Play", state["m_strPlayerMsg"]};
   if (state["m_bFancyPoker"] == 1) {
-    texts.push_back(NumberText("$%.0f", std::floor(wallet + 0.5)));
+    texts.push_back(MoneyText(std::floor(wallet + 0.5), 0));
     return texts;
   }
   // A single digit might be found on a card; it stands on the same white as all of these.
@@ -65,7 +65,7 @@ Texts PokerTexts(const Json& state) {
                            "Four of a Kind", "20", "Three of a Kind", "Full House", "Two Pair"}) {
     texts.push_back(text);
   }
-  texts.push_back(NumberText("$%d", static_cast<int>(wallet)));
+  texts.push_back(MoneyText(std::trunc(wallet), 0));
   return texts;
 }
 
@@ -108,12 +108,12 @@ Texts DialogTexts(const Json& state) {
     if (!control["visible"]) continue;
     const Json& r = control["rect"];
     Rect place{r[0], r[1], r[2], r[3]};
-    EXPECT_EQ(place.Common({1, 20, 239, 293}), place) << control;
+    EXPECT_EQ(place.Intersection({1, 20, 239, 293}), place) << control;
     const Texts lines = LinesOf(control, place);
     texts.insert(texts.end(), lines.begin(), lines.end());
     if (control["kind"] == "group") continue;
     if (control["kind"] == "static") ++place.top;  // no letter reaches that high
-    for (const Rect& other : taken) EXPECT_TRUE(place.Common(other).IsEmpty()) << control;
+    for (const Rect& other : taken) EXPECT_TRUE(place.Intersection(other).IsEmpty()) << control;
     taken.push_back(place);
   }
   texts.push_back(state["windows"].back());
