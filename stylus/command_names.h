@@ -9,8 +9,8 @@ namespace feltside {
 
 /// A command of the program and the name that scripts give it.
 struct NamedCommand {
-  const char* name;
-  int commandID;
+  const char* name = nullptr;
+  int commandID = 0;
   bool shown = true;  ///< in the tool bar or the menu; the others have keys alone
 };
 

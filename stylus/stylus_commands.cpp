@@ -186,8 +186,9 @@ void CStylus::Help(const Words&) {
     const std::string words = command.words;
     m_answer["lines"][command.name + (words.empty() ? "" : " " + words)] = command.does;
   }
-  for (const auto& [name, commandID, shown] : kNamedCommands)
-    m_answer["commands"][name] = commandID;
+  for (const NamedCommand& command : kNamedCommands) {
+    m_answer["commands"][command.name] = command.commandID;
+  }
 }
 
 void CStylus::Close(const Words&) {

@@ -8,6 +8,14 @@ namespace {
 
 using testing::ElementsAre;
 
+TEST(CardHand, NumbersTheSuitsFromSpades) {
+  const std::vector<int> cards = {52, 40, 39, 26, 13, 1};
+  const std::vector<int> suits = {0, 0, 1, 2, 3, 3};
+  for (std::size_t i = 0; i < cards.size(); ++i) {
+    EXPECT_EQ(CCardHand::GetSuit(cards[i]), suits[i]) << cards[i];
+  }
+}
+
 TEST(CardHand, AddsUpToItsLimit) {
   CCardHand hand;
   EXPECT_EQ(hand.AddCard(52), 0);
@@ -15,6 +23,8 @@ TEST(CardHand, AddsUpToItsLimit) {
   while (hand.AddCard(52) == 1) {
   }
   EXPECT_EQ(hand.GetCount(), 27);
+  EXPECT_EQ(hand.Clear(), 1);
+  EXPECT_EQ(hand.GetLimit(), 27);
   EXPECT_EQ(CBlackjackHand().GetLimit(), 5);
 }
 

@@ -7,14 +7,12 @@
 namespace feltside::tests {
 namespace {
 
-class Scripts : public testing::TestWithParam<const char*> {};
+class Scripts : public testing::TestWithParam<std::string> {};
 
 TEST_P(Scripts, RunAsWritten) { PlayScript(GetParam()); }
 
-INSTANTIATE_TEST_SUITE_P(Of, Scripts,
-                         testing::Values("blackjack_hands", "blackjack_table", "dialog_keys",
-                                         "dialog_stylus", "high_scores", "menu", "settings",
-                                         "setup", "stylus", "tips", "video_poker"));
+std::string NameOf(const testing::TestParamInfo<std::string>& script) { return script.param; }
+INSTANTIATE_TEST_SUITE_P(Of, Scripts, testing::ValuesIn(ScriptNames()), NameOf);
 
 }  // namespace
 }  // namespace feltside::tests

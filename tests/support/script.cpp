@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <filesystem>
 #include <fstream>
 #include <map>
 #include <memory>
@@ -158,10 +159,19 @@ class Player {
   std::string m_profile;
   std::unique_ptr<Stylus> m_pStylus;
   std::map<std::string, platform::CBitmap> m_looks;
-  Json m_before;  ///< the state after the last command
+  Json m_before = Json::object();  ///< the state after the last command
 };
 
 }  // namespace
+
+std::vector<std::string> ScriptNames() {
+  std::vector<std::string> names;
+  for (const auto& entry : std::filesystem::directory_iterator(FELTSIDE_SCRIPTS_FOLDER)) {
+    if (entry.path().extension() == ".txt") names.push_back(entry.path().stem());
+  }
+  std::sort(names.begin(), names.end());
+  return names;
+}
 
 void PlayScript(const std::string& name) {
   const std::string file = std::string(FELTSIDE_SCRIPTS_FOLDER) + "/" + name + ".txt";

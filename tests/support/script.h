@@ -7,6 +7,9 @@
 
 namespace feltside::tests {
 
+/// The files of tests/scripts, without their ending.
+std::vector<std::string> ScriptNames();
+
 /// Plays a file of tests/scripts through feltside-stylus and fails the test at every line that is
 /// not as expected. Its README says how such a file is written.
 void PlayScript(const std::string& name);
