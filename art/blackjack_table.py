@@ -1,9 +1,10 @@
 """The blackjack table: a quiet drawing on white, under everything that the game lays on it.
 
 The dealer stands at the top, so all arcs have their centre above the picture. The player box
-hides (12, 92)-(120, 176); cards lie from (79, 10) and (79, 217); the strategy button stands on
-the medallion. Nothing is darker than INK_LIMIT allows, so that dark red and black text keeps
-its contrast wherever it falls.
+hides (12, 92)-(120, 176); the dealer's cards lie from (79, 10), the player's from (79, 217), and
+those of a split from (19, 217) and (139, 217), each with a total some pixels to the right of where
+five cards end; the strategy button stands on the medallion. Nothing is darker than INK_LIMIT
+allows, so that dark red and black text keeps its contrast wherever it falls.
 """
 
 import math
@@ -25,7 +26,12 @@ _TEXT_BLANK = 2.6
 _TEXT_STROKE = 0.58
 
 _MEDALLION = (180, 118)
-_TRAYS = ((77, 8, 146, 53), (77, 215, 146, 260))
+_DEALERS_TRAY = (77, 8, 146, 53)
+# From side to side: one hand in the middle of it, two of a split, their names and their totals all
+# lie on it.
+_PLAYERS_TRAY = (10, 214, 230, 261)
+_TRAYS = (_DEALERS_TRAY, _PLAYERS_TRAY)
+_TRAY_INK = 6
 
 
 class Paper:
@@ -76,10 +82,17 @@ def _rounded(left, top, right, bottom, radius):
 
 
 def _notched(inset, notch):
-    """The whole picture less an inset, with quarter circles cut out of the corners."""
+    """The whole picture less an inset, a quarter circle cut out of each corner at the dealer's end,
+    the player's end rounded."""
+    radius = max(10 - inset, 0)
+
     def inside(x, y):
         dx, dy = min(x, WIDTH - x) - inset, min(y, HEIGHT - y) - inset
-        return dx >= 0 and dy >= 0 and math.hypot(dx, dy) >= notch
+        if dx < 0 or dy < 0:
+            return False
+        if y < HEIGHT / 2:
+            return math.hypot(dx, dy) >= notch
+        return math.hypot(max(radius - dx, 0), max(radius - dy, 0)) <= radius
     return inside
 
 
@@ -150,19 +163,23 @@ def _lay_medallion(paper):
 
 def _lay_tray(paper, tray):
     left, top, right, bottom = tray
-    box = (left - 1, top - 1, right + 1, bottom + 1)
-    paper.lay(_outline(_rounded(left, top, right, bottom, 4),
-                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)), INK_LIMIT, box)
-    middle_x, middle_y = (left + right) / 2, (top + bottom) / 2
+    whole, inner = _rounded(*tray, 4), _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)
+    paper.lay(_outline(whole, inner), INK_LIMIT, tray)
+    paper.lay(inner, _TRAY_INK, tray)
+
+
+def _lay_suits(paper, tray):
+    left, top, right, bottom = tray
     for place, suit in enumerate(shapes.SUITS):
-        paper.lay_placed(suit, middle_x + 15 * (place - 1.5), middle_y, 6, 16)
+        x = (left + right) / 2 + 15 * (place - 1.5)
+        paper.lay_placed(suit, x, (top + bottom) / 2, 6, 16)
 
 
 def _lay_frame(paper):
     paper.lay(_outline(_notched(2, 17), _notched(3, 18)), INK_LIMIT)
     paper.lay(_outline(_notched(5, 17), _notched(6, 18)), 18)
-    for place, (x, y) in enumerate(((8, 8), (232, 8), (232, 260), (8, 260))):
-        paper.lay_placed(shapes.SUITS[place], x, y, 6, 24)
+    for suit, x in ((shapes.spade, 8), (shapes.heart, WIDTH - 8)):
+        paper.lay_placed(suit, x, 8, 6, 24)
 
 
 def blackjack_table():
@@ -176,6 +193,7 @@ def blackjack_table():
     _lay_medallion(paper)
     for tray in _TRAYS:
         _lay_tray(paper, tray)
+    _lay_suits(paper, _DEALERS_TRAY)
     _lay_frame(paper)
     return paper.canvas()
 

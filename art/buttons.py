@@ -1,4 +1,4 @@
-"""Everything that can be pressed or that lights up: one light, one edge, one grey."""
+"""What can be pressed, with one light, one edge, one grey; and what is lit or marks a place."""
 
 from pathlib import Path
 
@@ -44,11 +44,16 @@ def bet_button(name, live):
     return button
 
 
-def lamp(name, light, shade):
-    """A square lamp in a raised rim; the sign in it tells right from wrong without its colour."""
-    picture = raised(13, 13)
-    picture.rect(2, 2, 11, 11, shade)
-    picture.rect(3, 3, 11, 11, light)
+def lamp(name, colours):
+    """A round lamp, lit, in a black socket; `colours` go from the rim of the glass to its middle.
+
+    The picture is copied as a block on a ground of any colour, so the socket is square; there is no
+    bevel about it, as nothing happens when it is pressed. The sign tells right from wrong without
+    the colour.
+    """
+    picture = Canvas(13, 13, "black")
+    picture.text_grid(0, 0, read_grids(_SOURCES / "lamp.txt")["lamp"],
+                      {"#": "black", "+": "ink", **dict(zip("dcl", colours))})
     sign(picture, 3, 3, name, "white")
     return picture
 
@@ -77,9 +82,10 @@ def make_all(output_dir):
     active_mark().save(output_dir / "134_active_mark.png", 16)
     word_button(73, "Insurance").save(output_dir / "139_insurance.png", 16)
     word_button(55, "Nope").save(output_dir / "143_no_insurance.png", 16)
-    lamp("check", "lamp_green", "green_dark").save(
-        output_dir / "141_lamp_green.png", 16)
-    lamp("cross", "card_red", "red_dark").save(output_dir / "144_lamp_red.png", 16)
+    green = ("lamp_green_rim", "lamp_green", "lamp_green_lit")
+    lamp("check", green).save(output_dir / "141_lamp_green.png", 16)
+    red = ("lamp_red_rim", "card_red", "red")
+    lamp("cross", red).save(output_dir / "144_lamp_red.png", 16)
     for number, name, sign_name, live in (
         (136, "bet_up", "plus", True),
         (137, "bet_down", "minus", True),

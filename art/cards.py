@@ -27,18 +27,24 @@ INDEX_MIDDLE, GLYPH_Y, INDEX_PIP_Y = 4, 2, 10
 # Top left corners of the pips. The first places are set again upside down in the lower half, the
 # second ones are not. Side by side or one below the other, they stand evenly spaced.
 LEFT, MIDDLE, RIGHT = 9, 12, 15
-_PAIR = ((LEFT, 4), (RIGHT, 4))
-_FOUR_PAIRS = ((LEFT, 3), (RIGHT, 3), (LEFT, 13), (RIGHT, 13))
+
+
+def _pairs(*rows):
+    return tuple((x, y) for y in rows for x in (LEFT, RIGHT))
+
+
 PIP_PLACES = {
     "2": (((10, 4),), ()),
     "3": (((10, 4),), ((10, 16),)),
-    "4": (_PAIR, ()),
-    "5": (_PAIR, ((MIDDLE, 17),)),
-    "6": (_PAIR, ((LEFT, 17), (RIGHT, 17))),
-    "7": (_PAIR, ((LEFT, 18), (RIGHT, 18), (MIDDLE, 11))),
-    "8": (_PAIR + ((MIDDLE, 11),), ((LEFT, 18), (RIGHT, 18))),
-    "9": (_FOUR_PAIRS, ((MIDDLE, 18),)),
-    "10": (_FOUR_PAIRS + ((MIDDLE, 8),), ()),
+    "4": (_pairs(4), ()),
+    "5": (_pairs(4), ((MIDDLE, 17),)),
+    "6": (_pairs(4), _pairs(17)),
+    "7": (_pairs(3), _pairs(17) + ((MIDDLE, 10),)),
+    "8": (_pairs(3) + ((MIDDLE, 10),), _pairs(17)),
+    "9": (_pairs(2, 10), ((MIDDLE, 17),)),
+    "10": (_pairs(2, 13) + ((MIDDLE, 8),), ()),
+    # A row further apart, as the leaves of two clubs would touch.
+    "10 of clubs": (_pairs(2, 14) + ((MIDDLE, 8),), ()),
 }
 PIP_SIZES = {"2": "big", "3": "big", "4": "medium", "5": "medium", "6": "medium"}
 
@@ -81,10 +87,13 @@ def _draw_ace(card, suit):
 
 def _draw_pips(card, suit, letter):
     colours = SUIT_COLOURS[suit]
-    pip = PIPS[f"{suit} {PIP_SIZES.get(letter, 'small')}"]
+    size = PIP_SIZES.get(letter, "small")
+    pip = PIPS[f"{suit} {size}"]
     turned = [row[::-1] for row in reversed(pip)]
-    mirrored, single = PIP_PLACES[letter]
+    # The black suits may have a row more, for the stem; the bodies stand at one height.
+    drop = len(PIPS[f"spades {size}"]) - len(pip)
+    mirrored, single = PIP_PLACES.get(f"{letter} of {suit}", PIP_PLACES[letter])
     for x, y in mirrored + single:
-        card.text_grid(x, y, pip, colours)
+        card.text_grid(x, y + drop, pip, colours)
     for x, y in mirrored:
-        card.text_grid(WIDTH - x - len(pip[0]), HEIGHT - y - len(pip), turned, colours)
+        card.text_grid(WIDTH - x - len(pip[0]), HEIGHT - y - drop - len(pip), turned, colours)

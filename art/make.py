@@ -12,6 +12,7 @@ sys.dont_write_bytecode = True
 import backs
 import cards
 import contact_sheet
+import icons
 import pictures
 
 ROOT = Path(__file__).resolve().parent.parent
@@ -22,6 +23,7 @@ def main():
     cards.make_all(RESOURCES)
     backs.make_all(RESOURCES)
     pictures.make_all(RESOURCES)
+    icons.make_editions(ROOT / "editions")
     contact_sheet.make(RESOURCES, ROOT / "art" / "contact_sheet.png")
 
 

@@ -17,8 +17,8 @@ SEEN_HEIGHT = 268
 
 # Where the game puts things: left, top, right, bottom.
 BUTTON = (70, 180, 155, 215)
-WALLET = (9, 230, 105, 254)
-RESULT = (125, 230, 234, 254)
+WALLET = (2, 230, 117, 254)
+RESULT = (121, 230, 239, 254)
 CARDS = [(x, 114, x + 29, 155) for x in (40, 73, 106, 139, 172)]
 
 PAYS = (
@@ -148,9 +148,12 @@ def button(picture):
     picture.rect(*BUTTON, "cell_violet")
     bevel(picture, BUTTON, "violet_pale", "violet_dark")
     bevel(picture, grown(BUTTON, -1), "violet_light", "violet_dark")
-    _small_card(picture, 81, 189, "card_red", "pink")
-    _small_card(picture, 86, 192, "white", "white")
-    sign(picture, 89, 197, "heart", "card_red")
+    # The word's ink goes from 104 to 130: what stands before it and after it leaves as much room
+    # beside the word, and the same at both ends of the button.
+    _small_card(picture, 82, 189, "card_red", "pink")
+    _small_card(picture, 87, 192, "white", "white")
+    sign(picture, 90, 197, "heart", "card_red")
+    sign(picture, 138, 195, "arrow", "violet_pale")
 
 
 def _small_card(picture, x, y, face, edge):
@@ -159,6 +162,20 @@ def _small_card(picture, x, y, face, edge):
     picture.rect(x, y + 1, x + 10, y + 13, "violet_dark")
     picture.rect(x + 1, y + 1, x + 9, y + 13, edge)
     picture.rect(x + 2, y + 2, x + 8, y + 12, face)
+
+
+def display(picture):
+    """A strip of glass from side to side of the cabinet, lit in two colours: the longest result
+    needs nearly all of its half."""
+    left, top, right, bottom = 1, WALLET[1], WIDTH - 1, WALLET[3]
+    for y, step in ((top - 2, 3), (top - 1, 0), (bottom, 9), (bottom + 1, 12)):
+        picture.rect(left, y, right, y + 1, night(step))
+    picture.rect(left, top - 1, left + 1, bottom, night(0))
+    for box, face in ((WALLET, "cell_blue"), (RESULT, "cell_slate")):
+        picture.rect(*box, face)
+    post = WALLET[2]
+    for x, step in enumerate((9, 7, 5, 1), post):
+        picture.rect(x, top - 1, x + 1, bottom + 1, night(step))
 
 
 def desk(picture):
@@ -180,8 +197,8 @@ def desk(picture):
 
 
 def labels(picture):
-    TINY.write(picture, WALLET[0], 221, "WALLET", night(18))
-    TINY.write(picture, RESULT[0], 221, "RESULT", night(18))
+    TINY.write(picture, 9, 221, "WALLET", night(18))
+    TINY.write(picture, RESULT[0] + 4, 221, "RESULT", night(18))
 
 
 def poker_table():
@@ -192,8 +209,7 @@ def poker_table():
     card_bay(picture)
     desk(picture)
     button(picture)
-    sunk_panel(picture, WALLET, "cell_blue")
-    sunk_panel(picture, RESULT, "cell_slate")
+    display(picture)
     labels(picture)
     return picture
 

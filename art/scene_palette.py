@@ -18,13 +18,18 @@ def _ramp(name, count, *stops):
 
 
 SCENE_PALETTE = {
-    # Stands for "no pixel" where a picture is transparent; never shown.
-    "nothing": (0xFF, 0x00, 0xFF),
+    # Stands for "no pixel" where a picture is transparent. The dark of the felt's rim: where a desktop
+    # scales an icon smoothly, a trace of it may show.
+    "nothing": (0x04, 0x30, 0x1A),
     # The one grey of everything that can be pressed; its edges are white, grey_80 and grey_40.
     "button_face": (0xD4, 0xD0, 0xC8),
     # The game lays the mark over the table with AND: pure red keeps exactly the red part.
     "mark_red": (0xFF, 0x00, 0x00),
+    # The glass of the lamps.
+    "lamp_green_rim": (0x00, 0x60, 0x18),
     "lamp_green": (0x00, 0x80, 0x28),
+    "lamp_green_lit": (0x20, 0xA0, 0x40),
+    "lamp_red_rim": (0x90, 0x00, 0x10),
     # Paper of the blackjack table. Nothing darker: texts in dark red and black lie on it.
     **{f"paper_{level}": (level, level, level) for level in range(226, 255)},
     # Felt, wood and brass of the title picture.

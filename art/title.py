@@ -1,14 +1,13 @@
-"""The title picture: the name over a table that has a seat free."""
+"""The title picture: the name over a table that has a seat free. Hard pixels throughout."""
 
 import math
+from pathlib import Path
 
 import cards
 import chips
+import courts
 import nameplate
-import shapes
-from lettering import stroked
-from pixels import Canvas
-from scene import Scene
+from pixels import Canvas, read_grids
 
 WIDTH, HEIGHT = 96, 116
 
@@ -18,30 +17,36 @@ _RAIL = 6
 _RAIL_DEPTH = 4
 
 _CARD_WIDTH, _CARD_HEIGHT = 34, 48
-# The point about which the cards are fanned, and how far below their lower edge it lies.
-_PIVOT = (46, 104)
-_REACH = 25
-_QUEEN = cards.make_face("hearts", "queen", "Q")
+_SIGNS = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "title.txt")
+
+
+def fill(picture, shape, colour):
+    """Fills the pixels whose middle a shape holds; `colour` is a name, or gives it at a point."""
+    for y in range(picture.height):
+        for x in range(picture.width):
+            if shape(x + 0.5, y + 0.5):
+                picture.put(x, y, colour(x + 0.5, y + 0.5) if callable(colour) else colour)
 
 
 def ellipse(x, y, rx, ry):
     return lambda px, py: ((px - x) / rx) ** 2 + ((py - y) / ry) ** 2 < 1
 
 
-def table(scene):
+def table(picture):
     x, y, rx, ry = _FELT
-    outer = ellipse(x, y, rx + _RAIL, ry + _RAIL)
+
+    def grown(by, drop=0):
+        return ellipse(x, y + drop, rx + by, ry + by)
+
     for drop in range(_RAIL_DEPTH, 0, -1):
-        scene.lay(ellipse(x, y + drop, rx + _RAIL, ry + _RAIL), "wood_0" if drop > 1 else "wood_1")
-    scene.lay(outer, "wood_3")
-    scene.lay(lambda px, py: outer(px, py) and not ellipse(x, y, rx + 4, ry + 4)(px, py),
-              lambda px, py: "wood_4" if py > y else "wood_2")
-    scene.lay(lambda px, py: ellipse(x, y, rx + 4, ry + 4)(px, py)
-              and not ellipse(x, y, rx + 3, ry + 3)(px, py), "wood_5")
-    scene.lay(ellipse(x, y, rx + 1, ry + 1), "wood_0")
-    scene.lay(ellipse(x, y, rx, ry), lambda px, py: felt_colour(px - x, py - y + 3))
-    scene.lay(lambda px, py: ellipse(x, y, rx - 6, ry - 4.8)(px, py)
-              and not ellipse(x, y, rx - 7, ry - 6)(px, py), "felt_6")
+        fill(picture, grown(_RAIL, drop), "wood_0" if drop > 1 else "wood_1")
+    fill(picture, grown(_RAIL), lambda px, py: "wood_4" if py > y else "wood_2")
+    fill(picture, grown(4), "wood_5")
+    fill(picture, grown(3), "wood_3")
+    fill(picture, grown(1), "wood_0")
+    fill(picture, grown(0), lambda px, py: felt_colour(px - x, py - y + 3))
+    fill(picture, lambda px, py: ellipse(x, y, rx - 6, ry - 4.8)(px, py)
+         and not ellipse(x, y, rx - 7, ry - 5.8)(px, py), "felt_6")
 
 
 def felt_colour(dx, dy):
@@ -50,67 +55,75 @@ def felt_colour(dx, dy):
     return f"felt_{max(3, min(6, round(7.4 - 4 * distance)))}"
 
 
-def card(scene, turn, face):
-    """A card turned about the hand, `face` giving the colour at a point of it."""
-    cosine, sine = math.cos(math.radians(turn)), math.sin(math.radians(turn))
+class LeaningCard:
+    """A large card that leans by a pixel in so many, to the left (below 0) or to the right.
 
-    def local(px, py):
-        dx, dy = px - _PIVOT[0], py - _PIVOT[1]
-        return (cosine * dx + sine * dy + _CARD_WIDTH / 2,
-                -sine * dx + cosine * dy + _CARD_HEIGHT + _REACH)
+    It leans by moving its rows and then its columns on, so that no pixel is lost or mixed.
+    """
 
-    def inside(margin):
-        def test(px, py):
-            u, v = local(px, py)
-            du = max(margin + 2.5 - u, u - (_CARD_WIDTH - margin - 2.5), 0)
-            dv = max(margin + 2.5 - v, v - (_CARD_HEIGHT - margin - 2.5), 0)
-            return math.hypot(du, dv) < 2.5
-        return test
+    def __init__(self, lean):
+        self._lean = lean
+        self._width = _CARD_WIDTH + (_CARD_HEIGHT - 1) // abs(lean)
+        self.canvas = Canvas(self._width, _CARD_HEIGHT + (self._width - 1) // abs(lean), "nothing")
+        card = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "ink")
+        card.rect(1, 1, _CARD_WIDTH - 1, _CARD_HEIGHT - 1, "white")
+        for x in (0, _CARD_WIDTH - 1):
+            for y in (0, _CARD_HEIGHT - 1):
+                card.put(x, y, "nothing")
+        self.lay(card)
 
-    scene.lay(inside(0), "ink")
-    scene.lay(inside(1.2), lambda px, py: face(*local(px, py)))
+    def lay(self, flat):
+        """Lays what is drawn on an upright card."""
+        right, step = self._lean > 0, abs(self._lean)
+        for y in range(flat.height):
+            for x in range(flat.width):
+                column = x + (_CARD_HEIGHT - 1 - y if right else y) // step
+                row = y + (column if right else self._width - 1 - column) // step
+                if flat.get(x, y) != "nothing":
+                    self.canvas.put(column, row, flat.get(x, y))
+
+    def sign_corners(self, places, colour):
+        """Sets signs that lean already, and the same upside down."""
+        corner = Canvas(self.canvas.width, self.canvas.height, "nothing")
+        for x, y, name in places:
+            corner.text_grid(x, y, _SIGNS[name], {"#": colour})
+        self.canvas.blit(corner, 0, 0, "nothing")
+        self.canvas.blit(corner.rotated180(), 0, 0, "nothing")
 
 
-def ace_of_spades(u, v):
-    middle = shapes.placed(shapes.spade, _CARD_WIDTH / 2, _CARD_HEIGHT / 2 - 0.5, 10.5)
-    if middle(u, v) or index(u, v, "A", shapes.spade):
-        return "ink"
-    return "white"
+def ace_of_spades():
+    card = LeaningCard(5)
+    card.canvas.text_grid(12, 17, _SIGNS["spade"], {"#": "ink"})
+    card.sign_corners(((11, 5, "ace letter"), (10, 14, "ace suit")), "ink")
+    return card.canvas
 
 
-def queen_of_hearts(u, v):
-    """The game's own queen, a little larger; her corners are drawn anew to read when turned."""
-    if u < 9 or u > _CARD_WIDTH - 9:
-        return "card_red" if index(u, v, "Q", shapes.heart) else "white"
-    column, row = int(u * _QUEEN.width / _CARD_WIDTH), int(v * _QUEEN.height / _CARD_HEIGHT)
-    return _QUEEN.get(column, row)
-
-
-def index(u, v, letter, suit):
-    """The rank and the suit in two opposite corners."""
-    if v > _CARD_HEIGHT / 2:
-        u, v = _CARD_WIDTH - u, _CARD_HEIGHT - v
-    if shapes.placed(suit, 5.4, 15.5, 3.5)(u, v):
-        return True
-    return v < 12 and stroked(letter, 0.68)((u - 3) / 1.1, (v - 3.6) / 1.1)
+def queen_of_hearts():
+    """The game's own queen, her sleeves drawn out to the edges of the larger card."""
+    card, small = LeaningCard(-5), cards.new_card()
+    courts.draw(small, "hearts", "queen")
+    left, top = (_CARD_WIDTH - small.width) // 2, (_CARD_HEIGHT - small.height) // 2
+    figure = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "nothing")
+    for y in range(2, small.height - 2):
+        for x in range(1, _CARD_WIDTH - 1):
+            figure.put(x, y + top, small.get(min(max(x - left, 1), small.width - 2), y))
+    card.lay(figure)
+    card.sign_corners(((3, 10, "queen letter"), (3, 20, "queen suit")), "card_red")
+    return card.canvas
 
 
 def chip_stack(picture, x, y, count, colours):
     shadow, felt = ellipse(x + 13, y + 7, 11, 4.5), ellipse(*_FELT)
-    for py in range(y, y + 14):
-        for px in range(x, x + 26):
-            if shadow(px + 0.5, py + 0.5) and felt(px + 0.5, py + 0.5):
-                picture.put(px, py, "felt_1")
+    fill(picture, lambda px, py: shadow(px, py) and felt(px, py), "felt_1")
     chips.stack(picture, x, y, count, colours)
 
 
 def title():
     picture = Canvas(WIDTH, HEIGHT)
-    scene = Scene(picture)
-    table(scene)
-    scene.lay(ellipse(50, 82, 22, 6), "felt_1")
-    card(scene, -14, queen_of_hearts)
-    card(scene, 12, ace_of_spades)
+    table(picture)
+    fill(picture, ellipse(50, 82, 24, 6), "felt_1")
+    picture.blit(queen_of_hearts(), 12, 27, "nothing")
+    picture.blit(ace_of_spades(), 37, 27, "nothing")
     chip_stack(picture, 12, 88, 4, chips.RED)
     chip_stack(picture, 65, 88, 3, chips.BLUE)
     chip_stack(picture, 39, 94, 1, chips.BLACK)

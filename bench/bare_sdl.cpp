@@ -14,11 +14,10 @@ void ShowPicture(int multiple) {
   SDL_Window* window = SDL_CreateWindow("bare", SDL_WINDOWPOS_CENTERED, SDL_WINDOWPOS_CENTERED,
                                         kFrameWidth * multiple, kFrameHeight * multiple,
                                         SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
-  SDL_Renderer* renderer = SDL_CreateRenderer(window, -1, SDL_RENDERER_SOFTWARE);
-  SDL_Texture* texture = SDL_CreateTexture(renderer, SDL_PIXELFORMAT_ARGB8888,
-                                           SDL_TEXTUREACCESS_STREAMING, kFrameWidth, kFrameHeight);
-  SDL_RenderCopy(renderer, texture, nullptr, nullptr);
-  SDL_RenderPresent(renderer);
+  SDL_Surface* picture =
+      SDL_CreateRGBSurfaceWithFormat(0, kFrameWidth, kFrameHeight, 32, SDL_PIXELFORMAT_ARGB8888);
+  SDL_BlitScaled(picture, nullptr, SDL_GetWindowSurface(window), nullptr);
+  SDL_UpdateWindowSurface(window);
 }
 
 }  // namespace
@@ -26,7 +25,6 @@ void ShowPicture(int multiple) {
 /// Takes the whole multiple at which the picture is shown.
 int main(int argc, char** argv) {
   SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
-  SDL_SetHint(SDL_HINT_RENDER_DRIVER, "software");
   if (argc != 2 || SDL_Init(SDL_INIT_VIDEO) != 0) return EXIT_FAILURE;
   ShowPicture(std::atoi(argv[1]));
   SDL_Event event;

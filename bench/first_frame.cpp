@@ -2,6 +2,7 @@
 // FIRST_FRAME_FILE names, as microseconds of the system's clock.
 
 #include <SDL_render.h>
+#include <SDL_video.h>
 #include <dlfcn.h>
 
 #include <cstdio>
@@ -20,13 +21,32 @@ void NoteTime() {
   std::fclose(file);
 }
 
-}  // namespace
-
-void SDL_RenderPresent(SDL_Renderer* renderer) {
-  using Present = void (*)(SDL_Renderer*);
-  static const auto present = reinterpret_cast<Present>(dlsym(RTLD_NEXT, "SDL_RenderPresent"));
+/// The first time only.
+void NoteFrame() {
   static bool noted = false;
-  present(renderer);
   if (!noted) NoteTime();
   noted = true;
+}
+
+/// SDL's own function of that name.
+template <class Function>
+Function* Behind(const char* name) {
+  return reinterpret_cast<Function*>(dlsym(RTLD_NEXT, name));
+}
+
+}  // namespace
+
+// A frame reaches the display by one of these two.
+
+void SDL_RenderPresent(SDL_Renderer* renderer) {
+  static auto* const present = Behind<decltype(SDL_RenderPresent)>("SDL_RenderPresent");
+  present(renderer);
+  NoteFrame();
+}
+
+int SDL_UpdateWindowSurface(SDL_Window* window) {
+  static auto* const update = Behind<decltype(SDL_UpdateWindowSurface)>("SDL_UpdateWindowSurface");
+  const int result = update(window);
+  NoteFrame();
+  return result;
 }

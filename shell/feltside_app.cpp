@@ -9,6 +9,8 @@
 #include "shell/main_frame.h"
 #include "shell/res/frame_resources.h"
 #include "shell/res/pictures.h"
+#include "shell/settings.h"
+#include "shell/window_memory.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -43,6 +45,7 @@ bool CFeltsideApp::InitInstance() {
   };
   AddDocTemplate(std::make_unique<platform::CSingleDocTemplate>(kDocumentString, makers));
   if (!OpenNewDocument()) return false;
+  RestoreWindowPlace();
   ShowMainWindow(IDR_MAINFRAME);
   LoadHighScores();
   return true;
@@ -50,7 +53,13 @@ bool CFeltsideApp::InitInstance() {
 
 int CFeltsideApp::ExitInstance() {
   SaveHighScores();
+  StoreWindowPlace();
   return CApplication::ExitInstance();
+}
+
+const platform::CProfileSection& CFeltsideApp::ReadSettings() {
+  m_settings = Profile().Read(kSettingsSection);
+  return m_settings;
 }
 
 void CFeltsideApp::OnNew() { OpenNewDocument(); }

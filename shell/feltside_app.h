@@ -22,10 +22,15 @@ class CFeltsideApp : public platform::CApplication {
   /// The whole number behind an entry's last blank; 0 where no digits stand there, the nearest
   /// bound where it is beyond an int.
   static int ScoreOf(const std::string& entry);
-  /// Enters a result below all that are as good; the sixth of a list falls off.
+  /// Enters a result below all that are as good, and stores it; the sixth of a list falls off.
   void AddHighScore(const std::string& name, int score);
   /// Whether a result earns a place.
   bool IsHighScore(int score) const;
+  /// Takes over the list of another game that has kept a result since this one read it.
+  void RefreshHighScores();
+
+  /// Reads the settings and high scores as they are stored now.
+  const platform::CProfileSection& ReadSettings();
 
  protected:
   bool InitInstance() override;
@@ -39,10 +44,12 @@ class CFeltsideApp : public platform::CApplication {
   void LoadHighScores();
   void SaveHighScores();
   void InsertHighScore(const std::string& name, int score);
+  void TakeOver(const std::vector<std::string>& stored);
 
+  platform::CProfileSection m_settings;  ///< as last read
   std::vector<std::string> m_arrHighScores;
-  std::vector<std::string> m_arrLoadedScores;  ///< as they were stored when the program started
-  std::vector<std::pair<std::string, int>> m_arrAdded;  ///< in this run
+  std::vector<std::string> m_arrLoadedScores;           ///< as they were last seen stored
+  std::vector<std::pair<std::string, int>> m_arrAdded;  ///< and not stored yet
 };
 
 /// The one application object.

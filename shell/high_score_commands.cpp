@@ -17,7 +17,9 @@ void CFeltsideView::OnHighScores() { CHighScoresDlg().DoModal(); }
 
 void CFeltsideView::OnExit() {
   const int score = WholeDollars(m_dWallet);
-  if (m_dWallet > kStartMoney && m_bUseHighScores != 0 && TheFeltsideApp().IsHighScore(score)) {
+  const bool isOffered = m_dWallet > kStartMoney && m_bUseHighScores != 0;
+  if (isOffered) TheFeltsideApp().RefreshHighScores();
+  if (isOffered && TheFeltsideApp().IsHighScore(score)) {
     CHighScoresDlg dialog;
     dialog.m_nScore = score;
     dialog.m_bNewHighScore = 1;

@@ -1,4 +1,4 @@
-// The five best results: loaded at the start, kept at the end.
+// The five best results: loaded at the start, stored when one is added and at the end.
 
 #include <algorithm>
 #include <cstdlib>
@@ -13,34 +13,44 @@ namespace {
 /// By place; as many as the list has.
 const std::vector<std::string> kEntryNames = {"High0", "High1", "High2", "High3", "High4"};
 
-/// What a list holds besides empty strings, which are no entries.
-std::vector<std::string> EntriesOf(std::vector<std::string> strings) {
-  strings.erase(std::remove(strings.begin(), strings.end(), ""), strings.end());
-  return strings;
+/// Empty strings are no entries.
+std::vector<std::string> EntriesOf(const platform::CProfileSection& stored) {
+  std::vector<std::string> entries;
+  for (const std::string& name : kEntryNames) {
+    if (const std::string entry = stored.GetString(name, ""); !entry.empty()) {
+      entries.push_back(entry);
+    }
+  }
+  return entries;
 }
 
 }  // namespace
 
-void CFeltsideApp::LoadHighScores() {
-  std::vector<std::string> strings;
-  strings.reserve(kEntryNames.size());
-  for (const std::string& name : kEntryNames) {
-    strings.push_back(Profile().GetString(kSettingsSection, name, ""));
-  }
-  m_arrHighScores = m_arrLoadedScores = EntriesOf(strings);
+/// As they were when the settings were read, a moment ago.
+void CFeltsideApp::LoadHighScores() { m_arrHighScores = m_arrLoadedScores = EntriesOf(m_settings); }
+
+void CFeltsideApp::RefreshHighScores() { TakeOver(EntriesOf(ReadSettings())); }
+
+/// Another game has kept a result since: that list is the one to go on with.
+void CFeltsideApp::TakeOver(const std::vector<std::string>& stored) {
+  if (stored.empty() || stored == m_arrLoadedScores) return;
+  m_arrHighScores = m_arrLoadedScores = stored;
+  for (const auto& [name, score] : m_arrAdded) InsertHighScore(name, score);
 }
 
 void CFeltsideApp::SaveHighScores() {
   if (m_arrHighScores.empty()) return;
-  Profile().UpdateStrings(kSettingsSection, kEntryNames, [this](const auto& strings) {
-    // Another game has kept a result since this one started: that list is the one to go on with.
-    const auto stored = EntriesOf(strings);
-    if (!stored.empty() && stored != m_arrLoadedScores) {
-      m_arrHighScores = stored;
-      for (const auto& [name, score] : m_arrAdded) InsertHighScore(name, score);
+  std::vector<std::string> written;
+  const bool stored = Profile().Update(kSettingsSection, [&](platform::CProfileSection& settings) {
+    TakeOver(EntriesOf(settings));
+    for (std::size_t place = 0; place < m_arrHighScores.size(); ++place) {
+      settings.Set(kEntryNames[place], m_arrHighScores[place]);
     }
-    return m_arrHighScores;
+    written = EntriesOf(settings);
   });
+  if (!stored) return;
+  m_arrLoadedScores = written;
+  m_arrAdded.clear();
 }
 
 int CFeltsideApp::ScoreOf(const std::string& entry) {
@@ -54,6 +64,7 @@ int CFeltsideApp::ScoreOf(const std::string& entry) {
 void CFeltsideApp::AddHighScore(const std::string& name, int score) {
   m_arrAdded.emplace_back(name, score);
   InsertHighScore(name, score);
+  SaveHighScores();
 }
 
 void CFeltsideApp::InsertHighScore(const std::string& name, int score) {

@@ -2,6 +2,7 @@
 #include <iostream>
 
 #include "platform/host/sdl_host.h"
+#include "shell/command_line.h"
 #include "shell/feltside_app.h"
 #include "shell/res/frame_resources.h"
 
@@ -10,7 +11,8 @@ namespace {
 constexpr int kExitNoDisplay = 3;
 }  // namespace
 
-int main(int, char**) {
+int main(int argc, char** argv) {
+  if (const auto exitCode = feltside::AnswerCommandLine(argc, argv)) return *exitCode;
   std::string why;
   const auto host = platform::CreateSdlHost(
       {feltside::kWindowSize, {"../share/feltside/help", FELTSIDE_HELP_FOLDER}}, why);

@@ -1,54 +1,99 @@
-// The player's choices as they are read from the profile into the table.
+// The player's choices as they are kept in the profile and held by the table.
 
 #include "shell/settings.h"
 
+#include <algorithm>
 #include <array>
+#include <limits>
+#include <type_traits>
 
-#include "platform/window/application.h"
+#include "shell/feltside_app.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
 namespace {
 
-constexpr platform::Color kDefaultTable = platform::Rgb(0, 155, 0);
-constexpr platform::Color kDefaultBox = platform::Rgb(135, 180, 100);
+constexpr int kDefaultTable = platform::Rgb(0, 155, 0);
+constexpr int kDefaultBox = platform::Rgb(135, 180, 100);
 constexpr int kLastColor = 0xFFFFFF;
+constexpr int kLeast = std::numeric_limits<int>::min();
+constexpr int kMost = std::numeric_limits<int>::max();
 
 /// The dealer's pause in milliseconds by play speed: slow, normal, fast.
 constexpr std::array<int, 3> kDealerDelays = {2000, 1000, 200};
-constexpr int kNormalSpeed = 1;
-
-int ReadSetting(const char* entry, int absent) {
-  return platform::TheApp().Profile().GetInt(kSettingsSection, entry, absent);
-}
-
-/// A value outside its range counts as absent.
-int ReadInRange(const char* entry, int lowest, int highest, int absent) {
-  const int value = ReadSetting(entry, absent);
-  return value < lowest || value > highest ? absent : value;
-}
-
-platform::Color ReadColor(const char* entry, platform::Color absent) {
-  return static_cast<platform::Color>(ReadInRange(entry, 0, kLastColor, static_cast<int>(absent)));
-}
 
 }  // namespace
 
+struct CFeltsideView::Settings {
+  using View = CFeltsideView;
+
+  struct Setting {
+    const char* name;
+    int lowest, highest;  ///< what lies outside counts as absent
+    int absent;           ///< the default
+    int (*get)(const View&);
+    void (*set)(View&, int);
+  };
+
+  /// A setting that a member holds; in the layout, that is a path of two.
+  template <auto... Path>
+  static constexpr Setting Of(const char* name, int lowest, int highest, int absent) {
+    return {name,
+            lowest,
+            highest,
+            absent,
+            [](const View& view) { return static_cast<int>((view.*....*Path)); },
+            [](View& view, int value) {
+              auto& member = (view.*....*Path);
+              member = static_cast<std::remove_reference_t<decltype(member)>>(value);
+            }};
+  }
+
+  static int GameType(const View& view) { return view.m_nGameType; }
+  /// A hand that is being played is played out in its own game.
+  static void SetGameType(View& view, int gameType) {
+    if (view.m_bHandInProgress == 0) view.m_nGameType = gameType;
+  }
+  static int PlaySpeed(const View& view) { return view.PlaySpeed(); }
+  static void SetPlaySpeed(View& view, int speed) { view.SetPlaySpeed(speed); }
+
+  static const std::array<Setting, 11> kAll;
+};
+
+/// In the order in which they are read.
+constexpr std::array<CFeltsideView::Settings::Setting, 11> CFeltsideView::Settings::kAll = {{
+    {"GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack, &GameType, &SetGameType},
+    Of<&View::m_bUseHighScores>("USEHIGH", 0, 1, 1),
+    Of<&View::m_bFancyPoker>("FANCYVP", 0, 1, 1),
+    Of<&View::m_bFancyBlackjack>("FANCYBJ", 0, 1, 1),
+    Of<&View::m_layout, &CTableLayout::m_nCardBackID>("CARDBACK", kFirstCardBackID, kLastCardBackID,
+                                                      kFirstCardBackID),
+    Of<&View::m_layout, &CTableLayout::m_crTable>("TABLECOLOR", 0, kLastColor, kDefaultTable),
+    Of<&View::m_layout, &CTableLayout::m_crBox>("BOXCOLOR", 0, kLastColor, kDefaultBox),
+    Of<&View::m_nMaxDiscards>("VIDEODISCARDS", 0, kPokerCards, 3),
+    Of<&View::m_nStrategyMode>("STRATTYPE", kStrategyNone, kStrategyAlways, kStrategyButton),
+    Of<&View::m_nDeckChoice>("NUMDECKS", 0, 2, 1),
+    {"PLAYSPEED", kLeast, kMost, 1, &PlaySpeed, &SetPlaySpeed},
+}};
+
 void CFeltsideView::LoadSettings() {
-  const int gameType = ReadInRange("GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack);
-  // A hand that is being played is played out in its own game.
-  if (m_bHandInProgress == 0) m_nGameType = gameType;
-  m_bUseHighScores = ReadInRange("USEHIGH", 0, 1, 1);
-  m_bFancyPoker = ReadInRange("FANCYVP", 0, 1, 1);
-  m_bFancyBlackjack = ReadInRange("FANCYBJ", 0, 1, 1);
-  m_layout.m_nCardBackID =
-      ReadInRange("CARDBACK", kFirstCardBackID, kLastCardBackID, kFirstCardBackID);
-  m_layout.m_crTable = ReadColor("TABLECOLOR", kDefaultTable);
-  m_layout.m_crBox = ReadColor("BOXCOLOR", kDefaultBox);
-  m_nMaxDiscards = ReadInRange("VIDEODISCARDS", 0, kPokerCards, 3);
-  m_nStrategyMode = ReadInRange("STRATTYPE", kStrategyNone, kStrategyAlways, kStrategyButton);
-  m_nDeckChoice = ReadInRange("NUMDECKS", 0, 2, 1);
-  SetPlaySpeed(ReadSetting("PLAYSPEED", kNormalSpeed));
+  const platform::CProfileSection& stored = TheFeltsideApp().ReadSettings();
+  for (const Settings::Setting& setting : Settings::kAll) {
+    const int value = stored.GetInt(setting.name, setting.absent);
+    const bool isInRange = value >= setting.lowest && value <= setting.highest;
+    setting.set(*this, isInRange ? value : setting.absent);
+  }
+}
+
+void CFeltsideView::StoreSettings(std::initializer_list<const char*> names) {
+  TheFeltsideApp().Profile().Update(kSettingsSection, [&](platform::CProfileSection& stored) {
+    for (const std::string name : names) {
+      const auto* setting =
+          std::find_if(Settings::kAll.begin(), Settings::kAll.end(),
+                       [&](const Settings::Setting& each) { return each.name == name; });
+      stored.Set(name, setting->get(*this));
+    }
+  });
 }
 
 void CFeltsideView::SetPlaySpeed(int speed) {

@@ -8,6 +8,7 @@
 #include "platform/dialog/dialog.h"
 #include "platform/host/offscreen_host.h"
 #include "shell/feltside_app.h"
+#include "table/feltside_view.h"
 
 namespace feltside {
 
@@ -23,15 +24,21 @@ class CStylus {
  private:
   using Json = nlohmann::ordered_json;
   using Words = std::vector<std::string>;
-  /// A command's name, how many words follow it, and what it does; it throws a CommandError that
-  /// says what is wrong with it.
+  /// A command's name, the words that follow it, what it does and how many words there may be;
+  /// `run` throws a CommandError that says what is wrong with them.
   struct Command {
     const char* name;
+    const char* words;
+    const char* does;
     std::size_t fewest;
     std::size_t most;
     void (CStylus::*run)(const Words& words);
   };
   static const std::vector<Command>& Commands();
+
+  static CFeltsideView& View();
+  /// The topmost dialog or message box; null while none is open.
+  static platform::CDialog* TopDialog();
 
   bool OnIdle();
   void Answer(const Json& answer);
@@ -53,6 +60,7 @@ class CStylus {
   void SetWallet(const Words& words);
   void Shot(const Words& words);
   void ShowState(const Words&) {}
+  void Help(const Words&);
   void Close(const Words& words);
   void Press(const Words& words);
   void Select(const Words& words);

@@ -6,10 +6,22 @@
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
+#include <optional>
 #include <system_error>
+
+#include "engine/card.h"
+#include "engine/card_text.h"
+#include "stylus/command_names.h"
 
 namespace feltside {
 namespace {
+
+std::optional<int> WholeNumber(const std::string& word) {
+  int value = 0;
+  const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
+  if (error != std::errc{} || end != word.data() + word.size()) return std::nullopt;
+  return value;
+}
 
 /// Digits and signs just where the time is written with them.
 bool HasTimeShape(const std::string& text) {
@@ -30,12 +42,24 @@ bool IsTime(const platform::LocalTime& t) {
 }  // namespace
 
 int ToInt(const std::string& word) {
-  int value = 0;
-  const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
-  if (error != std::errc{} || end != word.data() + word.size()) {
-    throw CommandError{"not a whole number: " + word};
+  const auto number = WholeNumber(word);
+  if (!number) throw CommandError{"not a whole number: " + word};
+  return *number;
+}
+
+int ToCommand(const std::string& word) {
+  for (const NamedCommand& command : kNamedCommands) {
+    if (word == command.name) return command.commandID;
   }
-  return value;
+  const auto number = WholeNumber(word);
+  if (!number) throw CommandError{"no such command: " + word};
+  return *number;
+}
+
+int ToCard(const std::string& word) {
+  const int card = WholeNumber(word).value_or(CardFromText(word));
+  if (!IsCard(card)) throw CommandError{"no such card: " + word};
+  return card;
 }
 
 platform::Point ToPoint(const std::vector<std::string>& words) {

@@ -17,6 +17,10 @@ struct CommandError {
 // that.
 
 int ToInt(const std::string& word);
+/// The identifier of a command, which may be given by its name too.
+int ToCommand(const std::string& word);
+/// A card by its rank and suit or by its number.
+int ToCard(const std::string& word);
 /// The two words behind a command's name.
 platform::Point ToPoint(const std::vector<std::string>& words);
 /// A finite number of dollars.

@@ -87,9 +87,6 @@ std::string CTableState::Stack(const std::vector<int>& cards) {
   const bool poker = m_view.m_nGameType == kGameVideoPoker;
   if (m_view.m_bHandInProgress != 0) return "a hand is in progress";
   if (cards.size() > (poker ? kMostPokerCards : kMostBlackjackCards)) return "too many cards";
-  for (const int card : cards) {
-    if (!IsCard(card)) return "no such card: " + std::to_string(card);
-  }
   CShoe* shoe = poker ? &m_view.m_deck1 : m_view.SelectedShoe();
   if (shoe == nullptr) return "there is no shoe";
   shoe->StackTop(cards);

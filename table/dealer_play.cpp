@@ -11,12 +11,11 @@ namespace {
 constexpr int kDealerStands = 17;
 constexpr int kDealerCards = 5;  ///< the dealer draws no sixth card
 
-/// Whether a message asks to leave the program: that has to wait until the deal is settled.
-bool AsksToLeave(const platform::Message& message) {
-  return message.kind == platform::MessageKind::kClose ||
-         message.kind == platform::MessageKind::kQuit ||
-         (message.kind == platform::MessageKind::kCommand &&
-          message.commandID == platform::kCommandExit);
+/// Whether what was already waiting when the dealer began waits on until the deal is settled, as it
+/// would if it came in a pause: all but the commands of a player who is still at it.
+bool WaitsForTheEnd(const platform::Message& message) {
+  return message.kind != platform::MessageKind::kCommand ||
+         message.commandID == platform::kCommandExit;
 }
 
 }  // namespace
@@ -24,8 +23,8 @@ bool AsksToLeave(const platform::Message& message) {
 void CFeltsideView::DealerPlay() {
   m_bHandInProgress = 0;
   m_strDealerScore = std::to_string(m_handDealer.GetTotal());
-  // None of what arrives may touch the deal being settled: the disabled frame refuses taps, keys
-  // and commands, and shows its buttons grey.
+  // None of what arrives may touch the deal being settled: the disabled frame refuses commands, and
+  // shows its menu and buttons grey.
   TopLevel().EnableWindow(false);
   platform::TheApp().MainFrame()->RefreshCommandStates();
   PumpMessages();
@@ -43,16 +42,16 @@ void CFeltsideView::DealerPlay() {
 
 void CFeltsideView::PumpMessages() {
   platform::CApplication& app = platform::TheApp();
-  std::vector<platform::Message> leaving;
+  std::vector<platform::Message> later;
   platform::Message message;
   while (app.Queue().Peek(message)) {
-    if (AsksToLeave(message)) {
-      leaving.push_back(message);
+    if (WaitsForTheEnd(message)) {
+      later.push_back(message);
     } else {
       app.Dispatch(message);
     }
   }
-  for (const platform::Message& waiting : leaving) app.Queue().Post(waiting);
+  for (const platform::Message& waiting : later) app.Queue().Post(waiting);
 }
 
 void CFeltsideView::Settle() {

@@ -4,6 +4,7 @@
 #include <initializer_list>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "engine/blackjack_hand.h"
 #include "engine/shoe.h"
@@ -98,10 +99,10 @@ class CFeltsideView : public platform::CView {
   // table/dealer_play.cpp: the dealer's turn and the settlement.
 
   /// The dealer draws, with a pause between cards, and the deal is settled before this returns.
-  /// Meanwhile the frame is disabled; keys that come are dropped.
+  /// Meanwhile the frame is disabled; keys that come are dropped, taps wait until it is over.
   void DealerPlay();
-  /// Handles what was already waiting when the dealer began. The disabled frame drops commands,
-  /// taps and keys; what asks to leave the program waits on until the deal is settled.
+  /// Clears away the commands that were already waiting when the dealer began: the disabled frame
+  /// refuses them. Taps, keys and what asks to leave the program wait on, as in the pauses.
   void PumpMessages();
   /// Ends the deal and moves its money, with the dealer's hand as it stands.
   void Settle();
@@ -155,6 +156,13 @@ class CFeltsideView : public platform::CView {
   bool KeyMark(char key);
   bool KeyTableButton(char key);
 
+  // table/tips.cpp: what the buttons on the table are called.
+
+  platform::ToolTip TipAt(platform::Point p) const override;
+  // Of the buttons that the table shows, also of those that are grey.
+  std::vector<platform::ToolTip> BlackjackTips() const;
+  std::vector<platform::ToolTip> VideoPokerTips() const;
+
   // render/frame.cpp: how a frame is put together.
 
   /// Returns true: the paint covers every pixel itself, so nothing is cleared before it.
@@ -181,10 +189,13 @@ class CFeltsideView : public platform::CView {
   void DrawVideoPokerTable(platform::CSurface& surface);
   void DrawFancyPokerTexts(platform::CSurface& surface);
 
-  // shell/settings.cpp: the player's choices, from the profile.
+  // shell/settings.cpp: the player's choices, from the profile and back.
 
+  struct Settings;
   /// While a hand is played its game stays selected, whatever the profile says.
   void LoadSettings();
+  /// Stores these in one step, in this order.
+  void StoreSettings(std::initializer_list<const char*> names);
   /// Sets the dealer's pause by a speed, 0 slow to 2 fast; any other leaves it as it was.
   void SetPlaySpeed(int speed);
   /// The speed that the pause stands for; -1 for none.

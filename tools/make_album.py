@@ -1,23 +1,21 @@
-#!/usr/bin/python3
-"""Makes the album of every screen of the game anew, in docs/album, and the README's pictures.
+#!/usr/bin/env python3
+"""Makes the album of every screen of the game anew, in docs/album; the README shows some of it.
 
     tools/make_album.py [--stylus FILE]
     tools/make_album.py [--stylus FILE] --vision KIND --into FOLDER
 
-plays the scenes of album_scenes.py with the stylus program (default: the one that ./play builds).
+plays the scenes of scenes.txt with the stylus program (default: the one that ./play builds).
 With --vision the album is shown as people with that kind of colour blindness see it, for looking
 at: whatever the game tells by a colour must still be told. Needs Pillow (Debian: python3-pil).
 """
 
 import argparse
 import html
-import shutil
 from pathlib import Path
 
-from album_scenes import PAGES, README
-from scenes import ROOT, SCALE, indexed, open_stylus, save, take
+from scenes import ROOT, SCALE, indexed, open_stylus, read_scenes, save, take
 
-DOCS = ROOT / "docs"
+ALBUM = ROOT / "docs" / "album"
 
 # What is left of red, green and blue (linear) where one kind of cone is missing. The figures are
 # those for severity 1.0 in G. M. Machado, M. M. Oliveira, L. A. F. Fernandes: A Physiologically-
@@ -71,8 +69,8 @@ def filtered(picture, matrix):
     return seen
 
 
-def figure(scene, caption, size):
-    text = html.escape(caption)
+def figure(scene, size):
+    text = html.escape(scene.caption)
     return (f'<figure><img src="{scene.name}.png" width="{size[0]}" height="{size[1]}" alt="">'
             f"<figcaption>{text}</figcaption></figure>")
 
@@ -97,15 +95,15 @@ def empty(folder):
 def make(stylus, folder, vision):
     empty(folder)
     figures = {}
-    for heading, scenes in PAGES.items():
-        figures[heading] = []
-        for scene, caption in scenes:
-            picture = take(stylus, scene)
-            if vision:
-                picture = filtered(picture, VISIONS[vision])
-            save(picture, folder / f"{scene.name}.png")
-            size = (picture.width * SCALE, picture.height * SCALE)
-            figures[heading].append(figure(scene, caption, size))
+    for scene in read_scenes().values():
+        if not scene.caption:
+            continue
+        picture = take(stylus, scene)
+        if vision:
+            picture = filtered(picture, VISIONS[vision])
+        save(picture, folder / f"{scene.name}.png")
+        size = (picture.width * SCALE, picture.height * SCALE)
+        figures.setdefault(scene.chapter, []).append(figure(scene, size))
     write_page(folder, figures, vision)
     print(f"{sum(map(len, figures.values()))} pictures in {folder}")
 
@@ -118,10 +116,7 @@ def main():
     options = parser.parse_args()
     if (options.vision is None) != (options.into is None):
         parser.error("--vision and --into go together")
-    make(open_stylus(options.stylus), options.into or DOCS / "album", options.vision)
-    if not options.vision:
-        for name, scene in README.items():
-            shutil.copyfile(DOCS / "album" / f"{scene}.png", DOCS / f"{name}.png")
+    make(open_stylus(options.stylus), options.into or ALBUM, options.vision)
 
 
 if __name__ == "__main__":

@@ -14,43 +14,53 @@ from pathlib import Path
 from PIL import Image
 
 ROOT = Path(__file__).resolve().parent.parent
+SCENES = ROOT / "tools" / "scenes.txt"
 STYLUS = ROOT / "build" / "play" / "feltside-stylus"
 SCALE = 2
-
-WINDOW = (0, 0, 240, 294)
-TABLE_TOP = 26  # the command bar stands above the table
-
-HIT, STAND, DOUBLE, SPLIT, DEAL = (f"command {n}" for n in (32771, 32772, 32775, 32773, 32776))
-GAME_SETUP, TABLE_SETUP, HIGH_SCORES, ABOUT, EXIT = (
-    f"command {n}" for n in (32779, 32777, 32781, 57664, 57665))
-
-VIDEO_POKER = {"GAME_TYPE": 1}
-PLAIN = {"FANCYBJ": 0, "FANCYVP": 0}
-SCORES = {"High0": "Hannah 412", "High1": "Old Tom 265", "High2": "Joe 150"}
 
 
 @dataclass
 class Scene:
-    """One picture: what is done before it is taken, and what of the window it shows."""
+    """A screen of the game, as tools/scenes.txt says how it comes about and what it is for."""
 
     name: str
-    lines: list
-    crop: tuple = WINDOW
-    settings: dict = field(default_factory=dict)
-    top: str = "Feltside"  # the title of the window that must then be on top
+    chapter: str
+    caption: str = ""  # in the album; empty: it is not there
+    settings: list = field(default_factory=list)
+    lines: list = field(default_factory=list)  # for the stylus program
+    parts: dict = field(default_factory=dict)  # for the help pages: rectangles in the window
+
+    def begin_with(self, other):
+        self.settings += other.settings
+        self.lines += other.lines
+
+    def add(self, line):
+        word, _, rest = line.partition(" ")
+        if word == "album":
+            self.caption = rest
+        elif word == "settings":
+            self.settings += rest.split("; ")
+        elif word == "help-picture":
+            name, *corners = rest.split()
+            self.parts[name] = tuple(map(int, corners))
+        elif word not in ("golden", "reads"):
+            self.lines.append(line)
 
 
-def table(left, top, right, bottom):
-    """A part of the table, which is given without the command bar."""
-    return (left, top + TABLE_TOP, right, bottom + TABLE_TOP)
-
-
-def deal(cards):
-    """A deal of cards such as "AS TH 2D": blackjack deals two to the player, then the dealer's hole
-    card and up card; the rest are drawn in order."""
-    numbers = ("CDHS".index(suit) * 13 + "A23456789TJQK".index(rank) + 1
-               for rank, suit in cards.split())
-    return ["stack " + " ".join(map(str, numbers)), DEAL]
+def read_scenes():
+    """All scenes, by their names."""
+    scenes, chapter, scene = {}, "", None
+    for line in SCENES.read_text(encoding="utf-8").splitlines():
+        word, _, rest = line.partition(" ")
+        if word == "chapter":
+            chapter = rest
+        elif word == "==":
+            scene = scenes[rest] = Scene(rest, chapter)
+        elif word == "from":
+            scene.begin_with(scenes[rest])
+        elif line and line[0] != ";":
+            scene.add(line)
+    return scenes
 
 
 def open_stylus(argument):
@@ -61,34 +71,25 @@ def open_stylus(argument):
     return stylus.resolve()
 
 
-def write_settings(folder, settings):
+def play(stylus, scene, folder, shot):
     profile = folder / "Quillworks" / "Feltside.toml"
     profile.parent.mkdir()
-    lines = [f"{key} = {json.dumps(value)}" for key, value in settings.items()]
-    profile.write_text("\n".join(["[Settings]"] + lines) + "\n")
-
-
-def play(stylus, scene, folder, shot):
-    write_settings(folder, scene.settings)
-    lines = scene.lines + [f"shot {shot}", "state"]
-    done = subprocess.run([stylus], input="\n".join(lines) + "\n", text=True, check=True,
-                          capture_output=True, timeout=60,
+    profile.write_text("\n".join(["[Settings]"] + scene.settings) + "\n", encoding="utf-8")
+    done = subprocess.run([stylus], input="\n".join(scene.lines + [f"shot {shot}"]) + "\n",
+                          encoding="utf-8", check=True, capture_output=True, timeout=60,
                           env=os.environ | {"XDG_CONFIG_HOME": str(folder)})
-    answers = [json.loads(line) for line in done.stdout.splitlines()]
-    for answer in answers:
+    for answer in map(json.loads, done.stdout.splitlines()):
         if "error" in answer or answer.get("refused"):
             raise SystemExit(f"{scene.name}: {answer}")
-    top = answers[len(lines) - 1]["windows"][-1]
-    if top != scene.top:
-        raise SystemExit(f"{scene.name}: \"{top}\" is on top, not \"{scene.top}\"")
 
 
 def take(stylus, scene):
+    """What the window shows at the end of the scene."""
     with tempfile.TemporaryDirectory() as folder:
         shot = Path(folder) / "shot.png"
         play(stylus, scene, Path(folder), shot)
         with Image.open(shot) as picture:
-            return picture.convert("RGBA").crop(scene.crop)
+            return picture.convert("RGBA")
 
 
 def indexed(picture):

@@ -27,7 +27,7 @@ void CComboBox::SetCurSel(int item) {
 }
 
 void CComboBox::Choose(int item) {
-  if (item == m_nChoice) return;
+  if (item == m_nChoice || item >= GetItemCount()) return;
   SetCurSel(item);
   Dialog().OnSelChange(GetID());
 }
@@ -74,7 +74,9 @@ void CComboBox::OnMouseWheel(int notches) {
   Step(-notches);
 }
 
-void CComboBox::Step(int items) { Choose(std::clamp(m_nChoice + items, 0, GetItemCount() - 1)); }
+void CComboBox::Step(int items) {
+  if (!m_arrItems.empty()) Choose(std::clamp(m_nChoice + items, 0, GetItemCount() - 1));
+}
 
 bool CComboBox::OnKeyDown(const KeyStroke& stroke) {
   if (stroke.key == Key::kF4 || stroke.character == ' ' ||

@@ -13,6 +13,8 @@ namespace {
 
 constexpr int kBorder = 1;
 constexpr int kCaptionHeight = 19;
+/// As much of the caption stays on the screen as it takes to pull the dialog back.
+constexpr int kGripWidth = 48;
 constexpr Size kCaptionButton{15, 13};
 
 bool CanTake(const CControl& control) {
@@ -235,7 +237,7 @@ void CDialog::DrawCaption(CSurface& surface) const {
 }
 
 void CDialog::OnLButtonDown(Point p) {
-  m_grip = p;
+  m_ptGrip = p;
   m_rcPressed = CloseButton().Contains(p)  ? CloseButton()
                 : HelpButton().Contains(p) ? HelpButton()
                                            : Rect{};
@@ -245,7 +247,7 @@ void CDialog::OnLButtonDown(Point p) {
 }
 
 void CDialog::OnMouseMove(Point p) {
-  if (m_bMoving) MoveBy(p - m_grip);
+  if (m_bMoving) MoveBy(p - m_ptGrip);
   if (m_bInside == m_rcPressed.Contains(p)) return;
   m_bInside = !m_bInside;
   Invalidate();
@@ -272,9 +274,9 @@ void CDialog::OnLButtonUp(Point p) {
 void CDialog::MoveBy(Point by) {
   const Rect place = GetPlace();
   const Size screen = TheApp().Screen().GetSize();
-  const Point limit{screen.width - place.Width(), screen.height - place.Height()};
-  const Point to{std::clamp(place.left + by.x, 0, std::max(0, limit.x)),
-                 std::clamp(place.top + by.y, 0, std::max(0, limit.y))};
+  const Point to{
+      std::clamp(place.left + by.x, kGripWidth - place.Width(), screen.width - kGripWidth),
+      std::clamp(place.top + by.y, 0, screen.height - kBorder - kCaptionHeight)};
   SetPlace(RectAt(to, {place.Width(), place.Height()}));
   TheApp().Screen().MarkStale();
 }

@@ -14,8 +14,8 @@ inline constexpr int kResultOk = 1;
 inline constexpr int kResultCancel = 2;
 
 /// A window that is worked with until it is closed, while everything beneath it is dead. It is
-/// built from a template, moved by its caption, always wholly on the screen, and closed by its
-/// buttons, by Escape or by the cross in its caption.
+/// built from a template, moved by its caption, off the screen but for a grip of it, and closed by
+/// its buttons, by Escape or by the cross in its caption.
 ///
 /// Keys: Tab and Shift+Tab go from control to control, Enter pushes the default button, a control's
 /// marked letter (with Alt, or alone where no text is typed) activates it, F1 asks for help.
@@ -24,7 +24,7 @@ class CDialog : public CTopWindow {
   explicit CDialog(const DialogTemplate& form);
   ~CDialog() override;
 
-  /// Runs the dialog and answers how it was ended. When the program is to end meanwhile, it is
+  /// Runs the dialog and returns how it was ended. When the program is to end meanwhile, it is
   /// cancelled.
   int DoModal();
   void EndDialog(int result);
@@ -91,7 +91,7 @@ class CDialog : public CTopWindow {
   bool m_bEnded = false;
   int m_nResult = kResultCancel;
   bool m_bMoving = false;
-  Point m_grip;            ///< where the caption was taken
+  Point m_ptGrip;          ///< where the caption was taken
   Rect m_rcPressed;        ///< the caption's button that the stylus went down on; empty: none
   bool m_bInside = false;  ///< still on it
 };

@@ -27,8 +27,8 @@ int NextItemByLetter(const std::vector<std::string>& items, int from, char lette
 
 Rect CDropList::PlaceFor(std::size_t items, const Rect& line) {
   const int height = static_cast<int>(items) * kRowHeight + 2;
-  const bool fitsBelow = line.bottom + height <= TheApp().Screen().GetSize().height;
-  const int top = fitsBelow ? line.bottom : std::max(0, line.top - height);
+  const int room = std::max(0, TheApp().Screen().GetSize().height - height);
+  const int top = line.bottom <= room ? line.bottom : std::clamp(line.top - height, 0, room);
   return {line.left, top, line.right, top + height};
 }
 
@@ -37,7 +37,7 @@ CDropList::CDropList(const std::vector<std::string>& items, int chosen, const Re
     : CTopWindow("", PlaceFor(items.size(), line), Kind::kPopup),
       m_arrItems(items),
       m_nHighlighted(chosen),
-      m_onChosen(std::move(onChosen)) {}
+      m_fnChosen(std::move(onChosen)) {}
 
 void CDropList::OnPaint(CSurface& surface) {
   surface.SetPen(kBlack);
@@ -72,19 +72,24 @@ void CDropList::OnLButtonUp(Point p) {
   }
 }
 
+/// A mouse that stays on an item leaves the highlight to the keys.
+void CDropList::OnMouseHover(Point p) {
+  if (const int item = ItemAt(p); std::exchange(m_nHovered, item) != item) OnMouseMove(p);
+}
+
 void CDropList::Highlight(int item) {
   m_nHighlighted = item;
   Invalidate();
 }
 
 void CDropList::Step(int items) {
-  const int last = static_cast<int>(m_arrItems.size()) - 1;
-  Highlight(std::clamp(m_nHighlighted + items, 0, last));
+  const int count = static_cast<int>(m_arrItems.size());
+  if (count > 0) Highlight(std::clamp(m_nHighlighted + items, 0, count - 1));
 }
 
 void CDropList::Choose() {
   Close();
-  if (m_nHighlighted >= 0) m_onChosen(m_nHighlighted);
+  if (m_nHighlighted >= 0) m_fnChosen(m_nHighlighted);
 }
 
 bool CDropList::OnKeyDown(const KeyStroke& stroke) {

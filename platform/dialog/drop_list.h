@@ -23,6 +23,7 @@ class CDropList : public CTopWindow {
   void OnLButtonDown(Point p) override { Highlight(ItemAt(p)); }
   void OnMouseMove(Point p) override;
   void OnLButtonUp(Point p) override;
+  void OnMouseHover(Point p) override;
   void OnMouseWheel(int notches) override { Step(-notches); }
   bool OnKeyDown(const KeyStroke& stroke) override;
   void OnPressOutside() override { Close(); }
@@ -36,7 +37,8 @@ class CDropList : public CTopWindow {
 
   std::vector<std::string> m_arrItems;
   int m_nHighlighted;
-  std::function<void(int item)> m_onChosen;
+  int m_nHovered = -1;  ///< the item under the mouse; -1: none
+  std::function<void(int item)> m_fnChosen;
 };
 
 }  // namespace platform

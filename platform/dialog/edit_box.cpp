@@ -35,40 +35,47 @@ std::string CEditBox::Selected() const {
   return GetText().substr(SelectionStart(), SelectionEnd() - SelectionStart());
 }
 
+std::string CEditBox::Shown() const {
+  std::string shown = GetText();
+  return shown.insert(m_nCaret, m_strComposition);
+}
+
 int CEditBox::CaretX(std::size_t at) const {
-  return kPadding - m_nScroll + MeasureText(kSystemFont, GetText().substr(0, at)).width;
+  return kPadding - m_nScroll + MeasureText(kSystemFont, Shown().substr(0, at)).width;
 }
 
 void CEditBox::OnPaint(CSurface& surface) {
   const Rect client = GetClientRect();
   DrawBox(surface, kWhite);
-  const int top = TextTop(client);
-  // Of a long text only the piece around the box is drawn.
-  const std::size_t from = FittingLength(kSystemFont, GetText(), m_nScroll - kPadding);
-  const std::string rest = GetText().substr(from);
-  const CBitmap stencil =
-      RenderText(kSystemFont, rest.substr(0, FittingLength(kSystemFont, rest, 2 * client.right)));
   // What is drawn within the border must not run over it.
-  CBitmap pixels({client.right - 2, client.bottom - 2}, kWhite);
-  CSurface inner(pixels);
-  const Point shift{-1, -1};
-  inner.DrawStencil(Point{CaretX(from), top} + shift, stencil, kBlack);
-  if (HasFocus()) {
-    if (m_nCaret != m_nAnchor) {
-      // A pixel more on every side, so that no light letter touches the light box.
-      const Rect marked =
-          Rect{CaretX(SelectionStart()), top, CaretX(SelectionEnd()), top + kSystemFont.height}
-              .Moved(shift)
-              .Shrunk(-1);
-      inner.FillRect(marked, kHighlight);
-      CSurface highlighted(pixels, marked.Intersection(pixels.Bounds()));
-      const Point origin = marked.Intersection(pixels.Bounds()).TopLeft();
-      highlighted.DrawStencil(Point{CaretX(from), top} + shift - origin, stencil, kWhite);
-    }
-    const int x = CaretX(m_nCaret) - 1 + shift.x;
-    inner.FillRect({x, top - 2, x + 1, top + kSystemFont.height}, kBlack);
+  CBitmap pixels({client.right, client.bottom}, kWhite);
+  CSurface inside(pixels);
+  DrawShown(inside);
+  surface.BitBlt({1, 1}, {client.right - 2, client.bottom - 2}, pixels, {1, 1});
+}
+
+void CEditBox::DrawShown(CSurface& inside) {
+  const int top = TextTop(GetClientRect());
+  const int bottom = top + kSystemFont.height;
+  // Of a long text only the piece around the box is drawn.
+  const std::size_t from = FittingLength(kSystemFont, Shown(), m_nScroll - kPadding);
+  const std::string rest = Shown().substr(from);
+  const CBitmap stencil = RenderText(
+      kSystemFont, rest.substr(0, FittingLength(kSystemFont, rest, 2 * GetClientRect().right)));
+  const Point at{CaretX(from), top};
+  inside.DrawStencil(at, stencil, kBlack);
+  if (!HasFocus()) return;
+  if (m_nCaret != m_nAnchor) {
+    // A pixel more on every side, so that no light letter touches the light box.
+    const Rect marked =
+        Rect{CaretX(SelectionStart()), top, CaretX(SelectionEnd()), bottom}.Shrunk(-1).Intersection(
+            inside.Bounds());
+    inside.FillRect(marked, kHighlight);
+    CSurface(inside, marked).DrawStencil(at - marked.TopLeft(), stencil, kWhite);
   }
-  surface.BitBlt({1, 1}, pixels.GetSize(), pixels);
+  const int caret = CaretX(CompositionEnd());
+  inside.FillRect({caret - 1, top - 1, caret, bottom + 1}, kBlack);
+  inside.FillRect({CaretX(m_nCaret), bottom, caret, bottom + 1}, kBlack);
 }
 
 std::size_t CEditBox::PlaceAt(int x) const {
@@ -79,10 +86,18 @@ std::size_t CEditBox::PlaceAt(int x) const {
 
 void CEditBox::OnLButtonDown(Point p) {
   TakeFocus();
-  MoveCaret(PlaceAt(p.x), false);
+  PointAt(p, false);
 }
 
-void CEditBox::OnMouseMove(Point p) { MoveCaret(PlaceAt(p.x), true); }
+void CEditBox::OnMiddleClick(Point p, const std::string& text) {
+  OnLButtonDown(p);
+  if (m_strComposition.empty()) Insert(text);
+}
+
+/// What is being composed stays where it is.
+void CEditBox::PointAt(Point p, bool select) {
+  if (m_strComposition.empty()) MoveCaret(PlaceAt(p.x), select);
+}
 
 void CEditBox::MoveCaret(std::size_t to, bool select) {
   m_nCaret = to;
@@ -93,13 +108,20 @@ void CEditBox::MoveCaret(std::size_t to, bool select) {
 void CEditBox::ScrollToCaret() {
   const int left = kPadding;
   const int right = GetClientRect().right - kPadding;
-  const int x = CaretX(m_nCaret);
+  const int x = CaretX(CompositionEnd());
   if (x < left) m_nScroll -= left - x;
   if (x > right) m_nScroll += x - right;
   // No blank room at the end while letters are hidden at the start.
-  const int width = MeasureText(kSystemFont, GetText()).width;
+  const int width = MeasureText(kSystemFont, Shown()).width;
   m_nScroll = std::clamp(m_nScroll, 0, std::max(0, width - (right - left)));
+  if (HasFocus()) PlaceTextInput();
   Invalidate();
+}
+
+void CEditBox::PlaceTextInput() {
+  const Rect client = GetClientRect();
+  const Rect text{CaretX(m_nCaret) - 1, 0, CaretX(CompositionEnd()), client.bottom};
+  TheHost().SetTextInput(text.Intersection(client).Moved(ScreenOrigin()));
 }
 
 void CEditBox::Insert(const std::string& text) {
@@ -165,12 +187,25 @@ bool CEditBox::OnClipboardKey(const KeyStroke& stroke) {
 }
 
 bool CEditBox::OnChar(const std::string& text) {
+  m_strComposition.clear();
   Insert(text);
   return true;
 }
 
+bool CEditBox::OnComposition(const std::string& text) {
+  if (m_nCaret != m_nAnchor) Insert("");
+  m_strComposition = OneLine(text);
+  ScrollToCaret();
+  return true;
+}
+
 void CEditBox::OnFocus(bool focused) {
-  TheHost().SetTextInput(focused);
+  m_strComposition.clear();
+  if (focused) {
+    PlaceTextInput();
+  } else {
+    TheHost().SetTextInput(std::nullopt);
+  }
   Invalidate();
 }
 

@@ -46,16 +46,16 @@ DialogTemplate FormFor(const std::string& text, MessageBoxButtons buttons) {
 class CMessageBox : public CDialog {
  public:
   CMessageBox(const std::string& text, MessageBoxButtons buttons)
-      : CDialog(FormFor(text, buttons)), m_buttons(buttons) {}
+      : CDialog(FormFor(text, buttons)), m_eButtons(buttons) {}
 
   void OnButton(int controlID) override { EndDialog(controlID); }
   void OnCancel() override {
-    EndDialog(static_cast<int>(m_buttons == MessageBoxButtons::kOk ? MessageBoxResult::kCancel
-                                                                   : MessageBoxResult::kNo));
+    EndDialog(static_cast<int>(m_eButtons == MessageBoxButtons::kOk ? MessageBoxResult::kCancel
+                                                                    : MessageBoxResult::kNo));
   }
 
  private:
-  MessageBoxButtons m_buttons;
+  MessageBoxButtons m_eButtons;
 };
 
 }  // namespace

@@ -40,7 +40,4 @@ std::optional<CBitmap> DecodePicture(const EmbeddedFile& file);
 /// Writes a bitmap as a PNG file; answers whether it was written.
 bool SavePng(const CBitmap& bitmap, const std::string& path);
 
-/// Reads a PNG file; nothing where it cannot be read.
-std::optional<CBitmap> LoadPng(const std::string& path);
-
 }  // namespace platform

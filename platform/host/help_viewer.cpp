@@ -27,20 +27,42 @@ fs::path HelpFolder(const std::vector<fs::path>& folders) {
   return {};
 }
 
-/// Runs the opener as a grandchild, so that it is nobody's to wait for when it ends.
-void OpenDetached(const std::string& address) {
+/// Becomes the opener, with nothing of it reaching the program's streams; where it cannot, says so
+/// through the pipe, which closes when it can.
+[[noreturn]] void BecomeOpener(const std::string& address, int pipe) {
+  const int nowhere = open("/dev/null", O_RDWR | O_CLOEXEC);
+  for (int stream = 0; stream <= 2; ++stream) dup2(nowhere, stream);
+  execlp("xdg-open", "xdg-open", address.c_str(), nullptr);
+  const char failed = 1;
+  if (write(pipe, &failed, 1) == 1) _exit(127);
+  _exit(126);
+}
+
+/// Calls a system function again for as long as only a signal keeps it from its work.
+template <class Call>
+auto Insist(const Call& call) {
+  auto result = call();
+  while (result < 0 && errno == EINTR) result = call();
+  return result;
+}
+
+/// Runs the opener as a grandchild, so that it is nobody's to wait for when it ends. Answers
+/// whether there is one; that it has started is known at once.
+bool OpenDetached(const std::string& address) {
+  int ends[2];
+  if (pipe2(ends, O_CLOEXEC) != 0) return false;
   const pid_t child = fork();
-  if (child > 0) {
-    while (waitpid(child, nullptr, 0) < 0 && errno == EINTR) {
-    }
-  } else if (child == 0) {
+  if (child == 0) {
     setsid();
-    if (fork() != 0) _exit(0);
-    const int nowhere = open("/dev/null", O_RDWR | O_CLOEXEC);
-    for (int stream = 0; stream <= 2; ++stream) dup2(nowhere, stream);
-    execlp("xdg-open", "xdg-open", address.c_str(), nullptr);
-    _exit(127);
+    if (fork() == 0) BecomeOpener(address, ends[1]);
+    _exit(0);
   }
+  close(ends[1]);
+  if (child > 0) Insist([child] { return waitpid(child, nullptr, 0); });
+  char failed = 0;
+  const bool started = child > 0 && Insist([&] { return read(ends[0], &failed, 1); }) == 0;
+  close(ends[0]);
+  return started;
 }
 
 }  // namespace
@@ -62,13 +84,15 @@ fs::path HelpPage(const std::vector<fs::path>& folders, const std::string& comma
   return fs::is_regular_file(folder / page, error) ? folder / page : fs::path{};
 }
 
-void StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
+bool StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
   const fs::path page = HelpPage(folders, commandLine);
   if (page.empty()) {
     std::cerr << "The help pages are not there.\n";
-    return;
+    return false;
   }
-  OpenDetached(page.string());
+  if (OpenDetached(page.string())) return true;
+  std::cerr << "There is no xdg-open to show the help with; it lies in " << page << ".\n";
+  return false;
 }
 
 }  // namespace platform

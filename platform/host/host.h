@@ -8,6 +8,7 @@
 #include "platform/draw/bitmap.h"
 #include "platform/host/input.h"
 #include "platform/host/runtime.h"
+#include "platform/host/window_place.h"
 
 namespace platform {
 
@@ -23,6 +24,11 @@ class Host {
   virtual void Show(const CBitmap& frame) = 0;
   /// Names the window and gives it an icon, where there is one.
   virtual void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) = 0;
+  /// Where the window is to open, said before the first picture. A place that is not on the desktop
+  /// any more is moved there.
+  virtual void SetWindowPlace(const WindowPlace& place) = 0;
+  /// Where the person has put the window; nothing where they have not, or where it cannot be put.
+  virtual std::optional<WindowPlace> GetWindowPlace() = 0;
 
   /// Takes the oldest input that has come, without waiting. False: there is none.
   virtual bool NextEvent(InputEvent& event) = 0;
@@ -34,15 +40,18 @@ class Host {
   virtual std::int64_t Ticks() = 0;
   virtual LocalTime Now() = 0;
 
-  /// Whether typed text is wanted: a device without a keyboard shows one while it is.
-  virtual void SetTextInput(bool wanted) = 0;
+  /// Says that typed text is wanted, and in which pixels of the window it stands: the list of an
+  /// input method, or the keyboard of a device without one, leaves them in sight. Nothing: no text
+  /// is wanted.
+  virtual void SetTextInput(const std::optional<Rect>& place) = 0;
   virtual std::string GetClipboard() = 0;
   virtual void SetClipboard(const std::string& text) = 0;
 
   /// Starts the help viewer with a command line such as "file:page.htm#topic", beside the program.
-  /// Nothing tells whether it came up.
-  virtual void StartHelpViewer(const std::string& commandLine) = 0;
-  /// The folder that keeps programs' settings; it need not exist yet.
+  /// False where it is known not to have come up, as the page or a viewer is missing.
+  virtual bool StartHelpViewer(const std::string& commandLine) = 0;
+  /// The folder that keeps programs' settings; it need not exist yet. Empty where the machine has
+  /// none.
   virtual std::filesystem::path ProfileFolder() = 0;
 };
 

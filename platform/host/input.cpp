@@ -56,4 +56,15 @@ std::optional<KeyStroke> ParseChord(const std::string& text) {
   return stroke;
 }
 
+std::string ChordText(const KeyStroke& stroke) {
+  std::string text;
+  if (stroke.ctrl) text += "Ctrl+";
+  if (stroke.alt) text += "Alt+";
+  if (stroke.shift) text += "Shift+";
+  for (const NamedKey& named : kNamedKeys) {
+    if (named.key == stroke.key) return text.append(named.name);
+  }
+  return stroke.character == ' ' ? text + "Space" : text + stroke.character;
+}
+
 }  // namespace platform

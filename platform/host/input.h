@@ -45,14 +45,20 @@ struct KeyStroke {
 /// where it names none.
 std::optional<KeyStroke> ParseChord(const std::string& text);
 
+/// The text that ParseChord takes for a key stroke.
+std::string ChordText(const KeyStroke& stroke);
+
 enum class InputKind {
   kPointerDown,
   kPointerMove,  ///< while the stylus is down or the mouse hovers
   kPointerUp,
+  kPointerLeave,  ///< a hovering mouse is no longer over the window; it has no place
+  kMiddleClick,   ///< the mouse's middle button; `text` is what is marked anywhere on the desktop
   kWheel,
   kKey,
   kText,
-  kClose,  ///< the window's close button, or the desktop asking the program to end
+  kComposition,  ///< `text` is what an input method has not finished yet; empty: it is done with it
+  kClose,        ///< the window's close button, or the desktop asking the program to end
 };
 
 /// One thing that a person did. Pointer places are pixels of the whole window.

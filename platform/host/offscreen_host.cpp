@@ -4,11 +4,6 @@
 
 namespace platform {
 
-void OffscreenHost::Show(const CBitmap& frame) {
-  m_shown = frame;
-  if (m_onFrame) m_onFrame(frame);
-}
-
 bool OffscreenHost::NextEvent(InputEvent& event) {
   if (m_arrInput.empty()) return false;
   event = m_arrInput.front();

@@ -21,26 +21,28 @@ class OffscreenHost : public Host {
   /// Called when the program waits for input and there is none, again and again until it has put
   /// some in. Once it answers false, and without a handler, the window is closed.
   void SetIdleHandler(std::function<bool()> onIdle) { m_onIdle = std::move(onIdle); }
-  /// Called with every shown picture.
-  void SetFrameHandler(std::function<void(const CBitmap&)> onFrame) {
-    m_onFrame = std::move(onFrame);
-  }
 
   const CBitmap& Shown() const { return m_shown; }
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
-  bool WantsText() const { return m_bWantsText; }
+  /// Where text is wanted; nothing where none is.
+  const std::optional<Rect>& TextPlace() const { return m_rcText; }
+  /// Whether help viewers come up from now on.
+  void SetHelpViewer(bool there) { m_bHelpViewer = there; }
 
-  void Show(const CBitmap& frame) override;
+  void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
+  void SetWindowPlace(const WindowPlace& place) override { m_windowPlace = place; }
+  std::optional<WindowPlace> GetWindowPlace() override { return m_windowPlace; }
   bool NextEvent(InputEvent& event) override;
   void WaitEvent(int milliseconds) override;
   std::int64_t Ticks() override { return m_nTicks; }
   LocalTime Now() override;
-  void SetTextInput(bool wanted) override { m_bWantsText = wanted; }
+  void SetTextInput(const std::optional<Rect>& place) override { m_rcText = place; }
   std::string GetClipboard() override { return m_strClipboard; }
   void SetClipboard(const std::string& text) override { m_strClipboard = text; }
-  void StartHelpViewer(const std::string& commandLine) override {
+  bool StartHelpViewer(const std::string& commandLine) override {
     m_arrHelpCalls.push_back(commandLine);
+    return m_bHelpViewer;
   }
   std::filesystem::path ProfileFolder() override { return m_profileFolder; }
 
@@ -48,14 +50,15 @@ class OffscreenHost : public Host {
   std::filesystem::path m_profileFolder;
   std::deque<InputEvent> m_arrInput;
   std::function<bool()> m_onIdle;
-  std::function<void(const CBitmap&)> m_onFrame;
   std::int64_t m_nTicks = 0;
   LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then
   CBitmap m_shown;
   std::string m_strClipboard;
   std::vector<std::string> m_arrHelpCalls;
-  bool m_bWantsText = false;
+  bool m_bHelpViewer = true;
+  std::optional<Rect> m_rcText;
+  std::optional<WindowPlace> m_windowPlace;
 };
 
 }  // namespace platform

@@ -6,57 +6,24 @@
 #endif
 
 #include <ctime>
-#include <string_view>
 #include <utility>
 
 #include "platform/host/help_viewer.h"
 #include "platform/host/profile_folder.h"
-#include "platform/host/sdl_keys.h"
+#include "platform/host/sdl_events.h"
+#include "platform/host/sdl_video.h"
 #include "platform/host/sdl_window.h"
 
 namespace platform {
 namespace {
-
-/// Whether keys are chords now and type nothing; some desktops send a text for them all the same.
-/// The right Alt key types letters of its own.
-bool IsChordHeld() {
-  const SDL_Keymod held = SDL_GetModState();
-  return (held & (KMOD_RALT | KMOD_MODE)) == 0 && (held & (KMOD_CTRL | KMOD_LALT)) != 0;
-}
-
-/// SDL's subsystems for as long as the host lives.
-class SdlVideo {
- public:
-  SdlVideo() {
-    // A card game that lies idle is no reason to keep the screen on.
-    SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
-    // Nor to take the desktop's effects away from all other windows.
-    SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
-    m_bReady = SDL_Init(SDL_INIT_VIDEO) == 0;
-  }
-  ~SdlVideo() { SDL_Quit(); }
-  SdlVideo(const SdlVideo&) = delete;
-  SdlVideo& operator=(const SdlVideo&) = delete;
-
-  /// Without a display SDL draws into the void and tells nobody.
-  bool HasDisplay() const {
-    if (!m_bReady) return false;
-    const std::string_view driver = SDL_GetCurrentVideoDriver();
-    return driver != "offscreen" && driver != "dummy";
-  }
-
- private:
-  bool m_bReady = false;
-};
 
 class SdlHost : public Host {
  public:
   SdlHost(std::unique_ptr<SdlVideo> video, const SdlHostOptions& options)
       : m_pVideo(std::move(video)),
         m_window(options.frameSize),
-        m_arrHelpFolders(options.helpFolders) {
-    SDL_StopTextInput();
-  }
+        m_events(m_window),
+        m_arrHelpFolders(options.helpFolders) {}
 
   bool IsReady() const { return m_window.IsOpen(); }
 
@@ -64,12 +31,15 @@ class SdlHost : public Host {
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override {
     m_window.SetIdentity(title, icon);
   }
+  void SetWindowPlace(const WindowPlace& place) override { m_window.SetPlace(place); }
+  std::optional<WindowPlace> GetWindowPlace() override { return m_window.GetPlace(); }
 
   bool NextEvent(InputEvent& event) override {
     SDL_Event raw;
     while (SDL_PollEvent(&raw) != 0) {
-      if (Translate(raw, event)) return true;
+      if (m_events.Translate(raw, event)) return true;
     }
+    m_window.Settle();
     return false;
   }
 
@@ -90,90 +60,29 @@ class SdlHost : public Host {
             local->tm_hour,        local->tm_min,     local->tm_sec};
   }
 
-  void SetTextInput(bool wanted) override {
-    if (wanted) {
-      SDL_StartTextInput();
-    } else {
-      SDL_StopTextInput();
-    }
+  void SetTextInput(const std::optional<Rect>& place) override {
+    if (!place) return SDL_StopTextInput();
+    const SDL_Rect rect = m_window.WindowRect(*place);
+    SDL_SetTextInputRect(&rect);
+    // Asked for again, it would end what is being composed.
+    if (SDL_IsTextInputActive() == SDL_FALSE) SDL_StartTextInput();
   }
 
-  std::string GetClipboard() override {
-    char* text = SDL_GetClipboardText();
-    std::string copy = text == nullptr ? "" : text;
-    SDL_free(text);
-    return copy;
-  }
+  std::string GetClipboard() override { return TakeText(SDL_GetClipboardText()); }
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
-  void StartHelpViewer(const std::string& commandLine) override {
-    platform::StartHelpViewer(m_arrHelpFolders, commandLine);
+  bool StartHelpViewer(const std::string& commandLine) override {
+    return platform::StartHelpViewer(m_arrHelpFolders, commandLine);
   }
 
   std::filesystem::path ProfileFolder() override { return DefaultProfileFolder(); }
 
  private:
-  /// Answers whether the event is one for the program; those for the window alone are done here.
-  bool Translate(const SDL_Event& raw, InputEvent& event);
-  bool TranslatePointer(InputKind kind, Uint8 button, int x, int y, InputEvent& event) const;
-  bool TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event);
-
   std::unique_ptr<SdlVideo> m_pVideo;
   SdlWindow m_window;
+  SdlEvents m_events;
   std::vector<std::filesystem::path> m_arrHelpFolders;
 };
-
-bool SdlHost::Translate(const SDL_Event& raw, InputEvent& event) {
-  event = {};
-  switch (raw.type) {
-    case SDL_QUIT:
-      event.kind = InputKind::kClose;
-      return true;
-    case SDL_WINDOWEVENT:
-      m_window.Refresh();
-      return false;
-    case SDL_MOUSEBUTTONDOWN:
-      return TranslatePointer(InputKind::kPointerDown, raw.button.button, raw.button.x,
-                              raw.button.y, event);
-    case SDL_MOUSEBUTTONUP:
-      return TranslatePointer(InputKind::kPointerUp, raw.button.button, raw.button.x, raw.button.y,
-                              event);
-    case SDL_MOUSEMOTION:
-      return TranslatePointer(InputKind::kPointerMove, SDL_BUTTON_LEFT, raw.motion.x, raw.motion.y,
-                              event);
-    case SDL_MOUSEWHEEL:
-      event.kind = InputKind::kWheel;
-      event.at = m_window.FramePoint(raw.wheel.mouseX, raw.wheel.mouseY);
-      event.wheel = raw.wheel.y;
-      return raw.wheel.y != 0;
-    case SDL_KEYDOWN:
-      return TranslateKey(raw.key, event);
-    case SDL_TEXTINPUT:
-      event.kind = InputKind::kText;
-      event.text = raw.text.text;
-      return !IsChordHeld();
-    default:
-      return false;
-  }
-}
-
-bool SdlHost::TranslatePointer(InputKind kind, Uint8 button, int x, int y,
-                               InputEvent& event) const {
-  if (button != SDL_BUTTON_LEFT) return false;
-  event.kind = kind;
-  event.at = m_window.FramePoint(x, y);
-  return true;
-}
-
-bool SdlHost::TranslateKey(const SDL_KeyboardEvent& key, InputEvent& event) {
-  if (key.keysym.sym == SDLK_F11) {
-    if (key.repeat == 0) m_window.ToggleFullScreen();
-    return false;
-  }
-  event.kind = InputKind::kKey;
-  event.stroke = StrokeOf(key.keysym);
-  return event.stroke.key != Key::kNone && (key.repeat == 0 || ActsWhileHeld(event.stroke.key));
-}
 
 /// A frame is composed in a block of its own at every paint. The memory of such blocks goes back to
 /// the system at once, rather than staying with the process between paints.
@@ -189,8 +98,8 @@ void ReturnLargeBlocks() {
 std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& why) {
   ReturnLargeBlocks();
   auto video = std::make_unique<SdlVideo>();
-  if (!video->HasDisplay()) {
-    why = "There is no display to show a window on.";
+  if (!video->Trouble().empty()) {
+    why = video->Trouble();
     return nullptr;
   }
   auto host = std::make_unique<SdlHost>(std::move(video), options);

@@ -1,16 +1,46 @@
 #include "platform/host/sdl_window.h"
 
 #include <algorithm>
-#include <cmath>
+
+#include "platform/host/frame_scaling.h"
+#include "platform/host/sdl_desktop.h"
 
 namespace platform {
 namespace {
 
-/// The share of the desktop's room that a window may take and still feel comfortable, in percent.
-constexpr int kComfortableShare = 90;
+/// The share of the desktop's room that a window may take and still feel comfortable, and what of
+/// that a whole multiple must fill to be preferred when it opens, both in percent.
+constexpr int kComfortablePercent = 90;
+constexpr int kFirstLeastPercent = 75;
+/// Window managers put a bar of about so many rows above what they have put in the middle.
+constexpr int kTitleBar = 24;
 
 /// The colour around a picture that does not fill the window.
 constexpr Uint8 kSurround = 32;
+
+Size SizeOf(const Rect& rect) { return {rect.Width(), rect.Height()}; }
+
+Rect ToRect(const SDL_Rect& rect) { return RectAt({rect.x, rect.y}, {rect.w, rect.h}); }
+
+/// What windows may cover of each display.
+std::vector<Rect> UsableDisplays() {
+  std::vector<Rect> displays;
+  for (int i = 0; i < SDL_GetNumVideoDisplays(); ++i) {
+    SDL_Rect bounds;
+    if (SDL_GetDisplayUsableBounds(i, &bounds) == 0) displays.push_back(ToRect(bounds));
+  }
+  return displays;
+}
+
+Size ComfortableSize(Size frame) {
+  const std::vector<Rect> displays = UsableDisplays();
+  if (displays.empty()) return frame;
+  const auto comfortable = [](int side) {
+    return std::max(1, std::min(side * kComfortablePercent / 100, side - 2 * kTitleBar));
+  };
+  return FittingSize(frame, {comfortable(displays[0].Width()), comfortable(displays[0].Height())},
+                     kFirstLeastPercent);
+}
 
 void SetIcon(SDL_Window* window, const CBitmap& icon) {
   std::vector<Pixel> pixels = icon.Pixels();
@@ -22,58 +52,41 @@ void SetIcon(SDL_Window* window, const CBitmap& icon) {
   SDL_FreeSurface(surface);
 }
 
-int FloorDivide(int value, int by) {
-  return static_cast<int>(std::floor(static_cast<double>(value) / by));
+void DrawScaled(const CBitmap& frame, const Rect& place, const SDL_Surface& canvas) {
+  const int width = place.Width();
+  ScaleFrame(frame, {width, place.Height()}, [&](int y, const std::vector<Pixel>& row) {
+    auto* line = static_cast<Uint8*>(canvas.pixels) + (place.top + y) * canvas.pitch;
+    SDL_ConvertPixels(width, 1, SDL_PIXELFORMAT_ARGB8888, row.data(), width * 4,
+                      canvas.format->format, line + place.left * canvas.format->BytesPerPixel,
+                      canvas.pitch);
+  });
 }
 
 }  // namespace
 
 SdlWindow::SdlWindow(Size frameSize) : m_frameSize(frameSize) {
-  if (!Open(true)) Open(false);
+  m_bOpen = Open(true) || Open(false);
+  if (m_bOpen) m_rcAsked = m_rcNormal = CurrentRect();
 }
 
-SdlWindow::~SdlWindow() { Release(); }
+SdlWindow::~SdlWindow() { Close(); }
 
-/// Plain is quickest and smallest: pixels in memory, handed to the desktop as they are. Displays
-/// without such a path take what SDL thinks best.
 bool SdlWindow::Open(bool plain) {
-  Release();
-  if (plain) {
-    SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
-    SDL_SetHint(SDL_HINT_RENDER_DRIVER, "software");
-  } else {
-    SDL_ResetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION);
-    SDL_ResetHint(SDL_HINT_RENDER_DRIVER);
-  }
-  SDL_SetHint(SDL_HINT_RENDER_SCALE_QUALITY, "nearest");
-  const int multiple = ComfortableMultiple();
-  m_pWindow = SDL_CreateWindow("", SDL_WINDOWPOS_CENTERED, SDL_WINDOWPOS_CENTERED,
-                               m_frameSize.width * multiple, m_frameSize.height * multiple,
-                               SDL_WINDOW_HIDDEN | SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
+  Close();
+  SdlCanvas::Prepare(plain);
+  const Size size = ComfortableSize(m_frameSize);
+  m_pWindow =
+      SDL_CreateWindow("", SDL_WINDOWPOS_CENTERED, SDL_WINDOWPOS_CENTERED, size.width, size.height,
+                       SDL_WINDOW_HIDDEN | SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
   if (m_pWindow == nullptr) return false;
-  SDL_SetWindowMinimumSize(m_pWindow, m_frameSize.width, m_frameSize.height);
-  m_pRenderer = SDL_CreateRenderer(m_pWindow, -1, plain ? SDL_RENDERER_SOFTWARE : 0);
-  if (m_pRenderer == nullptr) return false;
-  m_pTexture = SDL_CreateTexture(m_pRenderer, SDL_PIXELFORMAT_ARGB8888, SDL_TEXTUREACCESS_STREAMING,
-                                 m_frameSize.width, m_frameSize.height);
-  return m_pTexture != nullptr;
+  SDL_SetWindowMinimumSize(m_pWindow, m_frameSize.width / 2, m_frameSize.height / 2);
+  return m_canvas.Open(m_pWindow, plain);
 }
 
-void SdlWindow::Release() {
-  if (m_pTexture != nullptr) SDL_DestroyTexture(m_pTexture);
-  if (m_pRenderer != nullptr) SDL_DestroyRenderer(m_pRenderer);
+void SdlWindow::Close() {
+  m_canvas.Close();
   if (m_pWindow != nullptr) SDL_DestroyWindow(m_pWindow);
-  m_pTexture = nullptr;
-  m_pRenderer = nullptr;
   m_pWindow = nullptr;
-}
-
-int SdlWindow::ComfortableMultiple() const {
-  SDL_Rect room{};
-  if (SDL_GetDisplayUsableBounds(0, &room) != 0) return 1;
-  const int across = room.w * kComfortableShare / 100 / m_frameSize.width;
-  const int down = room.h * kComfortableShare / 100 / m_frameSize.height;
-  return std::max(1, std::min(across, down));
 }
 
 void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) {
@@ -81,48 +94,154 @@ void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitma
   if (icon) SetIcon(m_pWindow, *icon);
 }
 
-void SdlWindow::Show(const CBitmap& frame) {
-  SDL_UpdateTexture(m_pTexture, nullptr, frame.Pixels().data(), m_frameSize.width * 4);
-  if (!m_bShown) SDL_ShowWindow(m_pWindow);
-  m_bShown = true;
-  Refresh();
+Rect SdlWindow::CurrentRect() const {
+  Point at;
+  Size size;
+  SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
+  SDL_GetWindowSize(m_pWindow, &size.width, &size.height);
+  return RectAt(at, size);
 }
 
-void SdlWindow::Refresh() {
+void SdlWindow::PutAt(const Rect& rect) {
+  SDL_SetWindowSize(m_pWindow, rect.Width(), rect.Height());
+  SDL_SetWindowPosition(m_pWindow, rect.left, rect.top);
+  // Some window managers put their title bar there.
+  const Point at = rect.TopLeft() + rect.TopLeft() - CurrentRect().TopLeft();
+  if (at != rect.TopLeft()) SDL_SetWindowPosition(m_pWindow, at.x, at.y);
+}
+
+void SdlWindow::SetPlace(const WindowPlace& place) {
+  m_bPlaced = true;
+  PutAt(MovedOnto(UsableDisplays(), place.rect));
+  m_rcAsked = m_rcNormal = CurrentRect();
+  m_bOpensMaximized = place.maximized;
+}
+
+/// A window manager counts the title bar when it is told where to open a window, and not when it
+/// says where the window is. Without a look at that the window would wander from run to run.
+std::optional<WindowPlace> SdlWindow::GetPlace() const {
+  const bool moved = m_rcNormal != m_rcOpened;
+  if (!m_bPlaced && !moved && !IsMaximized()) return std::nullopt;
+  const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
+  return WindowPlace{moved ? m_rcNormal.Moved(Point{} - bar) : m_rcAsked, IsMaximized()};
+}
+
+void SdlWindow::Show(const CBitmap& frame) {
+  m_frame = frame;
+  m_bStale = true;
+  if (!m_bShown) Appear();
+  Settle();
+}
+
+void SdlWindow::Appear() {
+  m_bShown = true;
+  SDL_ShowWindow(m_pWindow);
+  SDL_PumpEvents();
+  m_rcOpened = CurrentRect();
+  const Rect inside = MovedOnto(UsableDisplays(), m_rcOpened);
+  if (inside != m_rcOpened) PutAt(inside);
+  m_rcNormal = CurrentRect();
+  if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
+}
+
+void SdlWindow::OnWindowEvent(const SDL_WindowEvent& event) {
+  m_bStale = m_bStale || event.event == SDL_WINDOWEVENT_EXPOSED ||
+             event.event == SDL_WINDOWEVENT_SIZE_CHANGED;
+}
+
+void SdlWindow::Settle() {
   if (!m_bShown) return;
-  const SDL_Rect place = FramePlace();
-  SDL_SetRenderDrawColor(m_pRenderer, kSurround, kSurround, kSurround, 255);
-  SDL_RenderClear(m_pRenderer);
-  SDL_RenderCopy(m_pRenderer, m_pTexture, nullptr, &place);
-  SDL_RenderPresent(m_pRenderer);
+  if (m_bStale) Draw();
+  if (!IsFullScreen() && !IsMaximized()) m_rcNormal = CurrentRect();
+}
+
+void SdlWindow::Draw() {
+  SDL_Surface* canvas = m_canvas.Begin();
+  if (canvas == nullptr) return;
+  const FrameFit fit(m_frameSize, {canvas->w, canvas->h});
+  if (fit.Place() != RectAt({}, {canvas->w, canvas->h})) {
+    SDL_FillRect(canvas, nullptr, SDL_MapRGB(canvas->format, kSurround, kSurround, kSurround));
+  }
+  DrawScaled(m_frame, fit.Place(), *canvas);
+  m_canvas.End();
+  m_bStale = false;
+}
+
+bool SdlWindow::IsFullScreen() const {
+  return m_bFillsDisplay || (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_FULLSCREEN) != 0;
+}
+
+bool SdlWindow::IsMaximized() const {
+  return IsFullScreen() ? m_bMaximizedBefore
+                        : (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_MAXIMIZED) != 0;
 }
 
 void SdlWindow::ToggleFullScreen() {
-  const bool full = (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_FULLSCREEN_DESKTOP) ==
-                    SDL_WINDOW_FULLSCREEN_DESKTOP;
-  SDL_SetWindowFullscreen(m_pWindow, full ? 0 : SDL_WINDOW_FULLSCREEN_DESKTOP);
+  if (IsFullScreen()) {
+    LeaveFullScreen();
+  } else {
+    EnterFullScreen();
+  }
 }
 
-SDL_Rect SdlWindow::FramePlace() const {
-  Size room = m_frameSize;
-  SDL_GetRendererOutputSize(m_pRenderer, &room.width, &room.height);
-  const int multiple =
-      std::max(1, std::min(room.width / m_frameSize.width, room.height / m_frameSize.height));
-  const int width = m_frameSize.width * multiple;
-  const int height = m_frameSize.height * multiple;
-  return {(room.width - width) / 2, (room.height - height) / 2, width, height};
+void SdlWindow::EnterFullScreen() {
+  m_bMaximizedBefore = IsMaximized();
+  if (KnowsFullScreen(m_pWindow)) {
+    SDL_SetWindowFullscreen(m_pWindow, SDL_WINDOW_FULLSCREEN_DESKTOP);
+    return;
+  }
+  SDL_Rect display;
+  if (SDL_GetDisplayBounds(SDL_GetWindowDisplayIndex(m_pWindow), &display) != 0) return;
+  m_bFillsDisplay = true;
+  PutAt(StillThere(m_pWindow, ToRect(display)));
 }
 
-Point SdlWindow::FramePoint(int x, int y) const {
-  Size window{1, 1};
-  Size room{1, 1};
-  SDL_GetWindowSize(m_pWindow, &window.width, &window.height);
-  SDL_GetRendererOutputSize(m_pRenderer, &room.width, &room.height);
-  const SDL_Rect place = FramePlace();
-  const int multiple = place.w / m_frameSize.width;
-  const int across = x * room.width / std::max(1, window.width) - place.x;
-  const int down = y * room.height / std::max(1, window.height) - place.y;
-  return {FloorDivide(across, multiple), FloorDivide(down, multiple)};
+/// The display may have become smaller meanwhile: the window manager says so, or has made the
+/// window smaller with it.
+std::vector<Rect> SdlWindow::RoomBehindFullScreen() const {
+  const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
+  std::vector<Rect> room;
+  for (Rect display : UsableDisplays()) {
+    display = StillThere(m_pWindow, display.Intersection(CurrentRect()));
+    if (bar.y > 0 && bar.y <= kTitleBar * 2) display.top += bar.y;
+    if (!display.IsEmpty()) room.push_back(display);
+  }
+  return room;
+}
+
+void SdlWindow::LeaveFullScreen() {
+  const Rect display = CurrentRect();
+  const Rect back = MovedOnto(RoomBehindFullScreen(), m_rcNormal);
+  if (!m_bFillsDisplay) SDL_SetWindowFullscreen(m_pWindow, 0);
+  m_bFillsDisplay = false;
+  if (m_bMaximizedBefore) {
+    SDL_MaximizeWindow(m_pWindow);
+  } else if (back != m_rcNormal || SizeOf(CurrentRect()) == SizeOf(display)) {
+    PutAt(back);
+  }
+}
+
+Size SdlWindow::SizeInPixels() const {
+  Size size{1, 1};
+  SDL_GetWindowSizeInPixels(m_pWindow, &size.width, &size.height);
+  return size;
+}
+
+Point SdlWindow::FramePoint(Point at) const {
+  const Size window = SizeOf(CurrentRect());
+  const Size pixels = SizeInPixels();
+  // The pixel under the middle of the place.
+  const Point pixel{(2 * at.x + 1) * pixels.width / (2 * window.width),
+                    (2 * at.y + 1) * pixels.height / (2 * window.height)};
+  return FrameFit(m_frameSize, pixels).FramePoint(pixel);
+}
+
+SDL_Rect SdlWindow::WindowRect(const Rect& pixels) const {
+  const Size window = SizeOf(CurrentRect());
+  const Size all = SizeInPixels();
+  const Rect seen = FrameFit(m_frameSize, all).RoomRect(pixels);
+  return {seen.left * window.width / all.width, seen.top * window.height / all.height,
+          seen.Width() * window.width / all.width, seen.Height() * window.height / all.height};
 }
 
 }  // namespace platform

@@ -6,11 +6,15 @@
 #include <string>
 
 #include "platform/draw/bitmap.h"
+#include "platform/host/frame_fit.h"
+#include "platform/host/sdl_canvas.h"
+#include "platform/host/window_place.h"
 
 namespace platform {
 
-/// The desktop window: it keeps the last picture and shows it sharp, at the largest whole multiple
-/// that the window has room for, in the middle.
+/// The desktop window: it keeps the last picture and shows it in whatever room the desktop gives
+/// it. Places in it are in SDL's window coordinates, of which a sharp display has several pixels
+/// each.
 class SdlWindow {
  public:
   explicit SdlWindow(Size frameSize);
@@ -19,27 +23,57 @@ class SdlWindow {
   SdlWindow& operator=(const SdlWindow&) = delete;
 
   /// Whether there is something to draw on.
-  bool IsOpen() const { return m_pTexture != nullptr; }
+  bool IsOpen() const { return m_bOpen; }
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon);
+
+  /// Before the first picture is shown; a place that has left the desktop is moved onto it.
+  void SetPlace(const WindowPlace& place);
+  /// Nothing where neither SetPlace nor the person has put the window anywhere.
+  std::optional<WindowPlace> GetPlace() const;
+
   void Show(const CBitmap& frame);
-  /// Shows the last picture again.
-  void Refresh();
+  /// Takes note that the desktop wants the picture again, or has put the window elsewhere.
+  void OnWindowEvent(const SDL_WindowEvent& event);
+  /// Does what events left to be done, once for all of them.
+  void Settle();
+
+  /// Fills the display or goes back, also on desktops that know no such thing.
   void ToggleFullScreen();
-  /// The pixel of the picture under a place in window coordinates; may lie beside the picture.
-  Point FramePoint(int x, int y) const;
+  /// The pixel of the picture under a place; may lie beside the picture.
+  Point FramePoint(Point at) const;
+  /// Where pixels of the picture are seen.
+  SDL_Rect WindowRect(const Rect& pixels) const;
 
  private:
   bool Open(bool plain);
-  void Release();
-  int ComfortableMultiple() const;
-  /// Where the picture stands in the window's own pixels.
-  SDL_Rect FramePlace() const;
+  void Close();
+  /// Is seen for the first time.
+  void Appear();
+  Rect CurrentRect() const;
+  void PutAt(const Rect& rect);
+  bool IsFullScreen() const;
+  /// In full screen: whether it was before.
+  bool IsMaximized() const;
+  std::vector<Rect> RoomBehindFullScreen() const;
+  void EnterFullScreen();
+  void LeaveFullScreen();
+  Size SizeInPixels() const;
+  void Draw();
 
   Size m_frameSize;
+  CBitmap m_frame;
   SDL_Window* m_pWindow = nullptr;
-  SDL_Renderer* m_pRenderer = nullptr;
-  SDL_Texture* m_pTexture = nullptr;
+  SdlCanvas m_canvas;
+  bool m_bOpen = false;
   bool m_bShown = false;
+  bool m_bStale = false;         ///< the desktop does not show the picture as it should be
+  bool m_bFillsDisplay = false;  ///< by its size alone, as the desktop knows no full screen
+  bool m_bPlaced = false;        ///< by SetPlace
+  bool m_bOpensMaximized = false;
+  bool m_bMaximizedBefore = false;  ///< before it filled the display
+  Rect m_rcAsked;                   ///< where the window was to open
+  Rect m_rcOpened;                  ///< where the desktop then put it
+  Rect m_rcNormal;  ///< where it last stood, neither maximised nor filling the display
 };
 
 }  // namespace platform

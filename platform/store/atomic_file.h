@@ -1,31 +1,34 @@
 #pragma once
 
+#include <chrono>
 #include <filesystem>
 #include <string>
+#include <system_error>
 
 namespace platform {
 
-/// Holds a lock that other processes respect for as long as it lives; without effect where the lock
-/// file cannot be made.
+/// Holds a lock that other processes respect for as long as it lives. On a file system that knows
+/// no locks it holds nothing, and refuses nothing.
 class CFileLock {
  public:
-  /// Waits for whoever holds it, but not longer than a person would.
-  explicit CFileLock(const std::filesystem::path& lockFile);
+  /// Waits so long for whoever holds it.
+  CFileLock(const std::filesystem::path& lockFile, std::chrono::milliseconds patience);
   ~CFileLock();
   CFileLock(const CFileLock&) = delete;
   CFileLock& operator=(const CFileLock&) = delete;
 
-  /// Whether somebody else still holds it.
-  bool IsRefused() const { return m_bRefused; }
+  /// Why it is not held, if so: std::errc::operation_would_block where somebody else still holds
+  /// it.
+  std::error_code Error() const { return m_error; }
 
  private:
   int m_nDescriptor;
-  bool m_bRefused = false;
+  std::error_code m_error;
 };
 
 /// Writes a new file beside the old one, with the old one's permissions, flushes it to the disk and
-/// renames it over the old one. Answers whether all of that went well; otherwise, as with a file
-/// that may not be written, the old file is as it was.
-bool ReplaceFile(const std::filesystem::path& file, const std::string& text);
+/// renames it over the old one. Answers what went wrong, if anything did; then, as with a file that
+/// may not be written, the old file is as it was.
+std::error_code ReplaceFile(const std::filesystem::path& file, const std::string& text);
 
 }  // namespace platform

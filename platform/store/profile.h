@@ -2,38 +2,81 @@
 
 #include <filesystem>
 #include <functional>
+#include <map>
+#include <memory>
+#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace platform {
 
-/// The store of the player's choices: integers and strings by section and entry, in one file that
-/// two running games may share.
-///
-/// Every call reads the file anew. A missing file, entry or a value of another type reads as the
-/// default. A file that cannot be understood is set aside under another name and said on the error
-/// stream. A write replaces the file as a whole, so it is either the old one or the new one
-/// whatever happens; where it fails, the old file stays and the error stream says so.
-class CProfile {
+/// The integers and strings of one section of the profile, as they were read at one moment.
+class CProfileSection {
  public:
-  explicit CProfile(std::filesystem::path file);
+  /// An integer or, where there is none, a string.
+  struct Value {
+    std::optional<int> number;
+    std::string text;
+  };
 
-  int GetInt(const std::string& section, const std::string& entry, int absent) const;
-  std::string GetString(const std::string& section, const std::string& entry,
-                        const std::string& absent) const;
-  /// Answers whether the value is on the disk.
-  bool WriteInt(const std::string& section, const std::string& entry, int value) const;
+  CProfileSection() = default;
+  explicit CProfileSection(std::map<std::string, Value> stored) : m_values(std::move(stored)) {}
 
-  /// Takes the strings of some entries, empty where there is none, and answers what to write from
-  /// the first entry on; at most as many.
-  using StringsRule = std::function<std::vector<std::string>(const std::vector<std::string>&)>;
-  /// Changes several strings in one step: all of them or, when the program dies, none; and no other
-  /// game comes between the reading and the writing. Answers whether they are on the disk.
-  bool UpdateStrings(const std::string& section, const std::vector<std::string>& entries,
-                     const StringsRule& rule) const;
+  // A missing value, or one of the other type, reads as the default.
+  int GetInt(const std::string& entry, int absent) const;
+  std::string GetString(const std::string& entry, const std::string& absent) const;
+
+  /// Changes a value here; only CProfile::Update stores it.
+  void Set(const std::string& entry, int number) { Put(entry, {number, {}}); }
+  void Set(const std::string& entry, const std::string& text) { Put(entry, {std::nullopt, text}); }
+  /// All that was set, also what was the same before, in the order in which it was set.
+  const std::vector<std::pair<std::string, Value>>& Changes() const { return m_changes; }
 
  private:
-  std::filesystem::path m_file;
+  const Value* Find(const std::string& entry) const;
+  void Put(const std::string& entry, const Value& value);
+
+  std::map<std::string, Value> m_values;
+  std::vector<std::pair<std::string, Value>> m_changes;
 };
+
+/// The store of the player's choices: integers and strings by section and entry, which two running
+/// games may share. Every call reads it anew.
+///
+/// Nothing of it throws and nothing ends the program: what cannot be read counts as absent, what
+/// cannot be stored leaves the store as it was, and a sentence says so on the error stream and to
+/// whoever takes the troubles.
+class CProfile {
+ public:
+  CProfile() = default;
+  virtual ~CProfile() = default;
+  CProfile(const CProfile&) = delete;
+  CProfile& operator=(const CProfile&) = delete;
+
+  virtual CProfileSection Read(const std::string& section) = 0;
+
+  using Change = std::function<void(CProfileSection&)>;
+  /// Changes values of a section in one step: `change` is given the section as it is stored and
+  /// sets what is to be stored. All of that is then on the disk or, when the program dies or the
+  /// answer is false, none of it; no other game comes between.
+  virtual bool Update(const std::string& section, const Change& change) = 0;
+
+  /// Hands over what went wrong since the last time, as sentences for the player. The same one
+  /// comes once only, until something can be stored again.
+  std::vector<std::string> TakeTroubles();
+
+ protected:
+  void Tell(const std::string& trouble);
+  void ForgetTold() { m_told.clear(); }
+
+ private:
+  std::vector<std::string> m_troubles;
+  std::vector<std::string> m_told;
+};
+
+/// Opens the profile that this machine keeps in, or under the name of, a file. Neither the file nor
+/// its folder need exist. An empty path keeps nothing.
+std::unique_ptr<CProfile> OpenProfile(const std::filesystem::path& file);
 
 }  // namespace platform

@@ -40,7 +40,7 @@ void CApplication::RunUntil(const std::function<bool()>& done) {
   while (!m_bQuit && !done()) {
     if (!m_queue.Peek(message)) {
       OnIdle();
-      m_queue.Wait();
+      m_queue.Wait(m_screen.TimeToTip());
     } else if (message.kind == MessageKind::kQuit) {
       m_bQuit = true;
       m_nExitCode = message.exitCode;
@@ -73,7 +73,8 @@ void CApplication::OnIdle() {
 }
 
 void CApplication::SetRegistryKey(const std::string& key) {
-  m_pProfile = std::make_unique<CProfile>(TheHost().ProfileFolder() / key / (m_strName + ".toml"));
+  const std::filesystem::path folder = TheHost().ProfileFolder();
+  m_pProfile = OpenProfile(folder.empty() ? folder : folder / key / (m_strName + ".toml"));
 }
 
 void CApplication::AddDocTemplate(std::unique_ptr<CSingleDocTemplate> docTemplate) {

@@ -26,7 +26,7 @@ class CApplication : public CCommandTarget {
   CApplication(const CApplication&) = delete;
   CApplication& operator=(const CApplication&) = delete;
 
-  /// Starts the program, runs it to its end and answers the exit code.
+  /// Starts the program, runs it to its end and returns the exit code.
   int Main();
 
   /// Also the title of message boxes and the name of the settings' file.
@@ -34,8 +34,8 @@ class CApplication : public CCommandTarget {
   CMessageQueue& Queue() { return m_queue; }
   CScreen& Screen() { return m_screen; }
   CResources& Resources() { return m_resources; }
-  /// The settings' file; SetRegistryKey comes first.
-  const CProfile& Profile() const { return *m_pProfile; }
+  /// Where the player's choices are kept; SetRegistryKey comes first.
+  CProfile& Profile() const { return *m_pProfile; }
   CFrameWindow* MainFrame() const { return m_pMainFrame; }
 
   /// Handles one message. kQuit is not for here.
@@ -46,7 +46,7 @@ class CApplication : public CCommandTarget {
  protected:
   /// Builds the program's window; false ends the program at once.
   virtual bool InitInstance() = 0;
-  /// What is to be done at the end; answers the exit code.
+  /// What is to be done at the end; returns the exit code.
   virtual int ExitInstance() { return m_nExitCode; }
 
   /// Names the maker under whose folder the settings lie.

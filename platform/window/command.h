@@ -2,7 +2,7 @@
 
 namespace platform {
 
-/// What a command target answers when it is asked whether a command may run.
+/// What a command target says when it is asked whether a command may run.
 enum class CommandState {
   kUnknown,  ///< not a command of this target; ask the next one
   kDisabled,

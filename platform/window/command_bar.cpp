@@ -1,6 +1,7 @@
 #include "platform/window/command_bar.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/draw/look.h"
 #include "platform/window/application.h"
@@ -39,20 +40,19 @@ void CCommandBar::AddAdornments() {
 }
 
 void CCommandBar::LoadToolBar(const ToolBarTemplate& toolBar) {
-  const auto buttons =
-      toolBar.commandIDs.size() -
-      static_cast<std::size_t>(std::count(toolBar.commandIDs.begin(), toolBar.commandIDs.end(), 0));
+  const auto count = std::count_if(toolBar.buttons.begin(), toolBar.buttons.end(),
+                                   [](const ToolButton& button) { return button.commandID != 0; });
   const Size image = toolBar.imageSize;
   const CBitmap& strip = TheApp().Resources().LoadBitmap(
-      toolBar.bitmapID, {image.width * static_cast<int>(buttons), image.height});
+      toolBar.bitmapID, {image.width * static_cast<int>(count), image.height});
   int x = m_rcTitle.right + kSeparatorWidth;
-  for (const int commandID : toolBar.commandIDs) {
-    if (commandID == 0) {
+  for (const ToolButton& button : toolBar.buttons) {
+    if (button.commandID == 0) {
       m_arrSeparators.push_back(x + kSeparatorWidth / 2);
       x += kSeparatorWidth;
     } else {
       const int number = static_cast<int>(m_arrButtons.size());
-      m_arrButtons.push_back({commandID, CutOut(strip, RectAt({number * image.width, 0}, image)),
+      m_arrButtons.push_back({button, CutOut(strip, RectAt({number * image.width, 0}, image)),
                               RectAt({x, kTop}, kButtonSize), false});
       x += kButtonSize.width;
     }
@@ -60,11 +60,13 @@ void CCommandBar::LoadToolBar(const ToolBarTemplate& toolBar) {
 }
 
 void CCommandBar::RefreshStates() {
-  for (Button& button : m_arrButtons) {
-    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(button.commandID);
-    if (button.enabled == enabled) continue;
-    button.enabled = enabled;
+  if (const bool enabled = TopLevel().IsEnabled();
+      std::exchange(m_bMenuEnabled, enabled) != enabled) {
     Invalidate();
+  }
+  for (Button& button : m_arrButtons) {
+    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(button.tool.commandID);
+    if (std::exchange(button.enabled, enabled) != enabled) Invalidate();
   }
 }
 
@@ -88,6 +90,14 @@ void CCommandBar::OpenMenu() {
   Invalidate();
 }
 
+ToolTip CCommandBar::TipAt(Point p) const {
+  if (m_rcClose.Contains(p)) return {"Close", m_rcClose};
+  for (const Button& button : m_arrButtons) {
+    if (button.place.Contains(p)) return {button.tool.tip, button.place};
+  }
+  return {};
+}
+
 void CCommandBar::OnPaint(CSurface& surface) {
   surface.FillRect({0, GetClientRect().bottom - 1, GetClientRect().right, GetClientRect().bottom},
                    kShadowEdge);
@@ -99,8 +109,8 @@ void CCommandBar::OnPaint(CSurface& surface) {
 void CCommandBar::DrawTitle(CSurface& surface) const {
   if (m_bMenuOpen) surface.FillRect(m_rcTitle, kHighlight);
   const int y = m_rcTitle.top + (m_rcTitle.Height() - kSystemFont.height) / 2;
-  DrawMnemonicText(surface, {m_rcTitle.left + kTitlePadding, y}, m_menu.title,
-                   m_bMenuOpen ? kWhite : kBlack);
+  const Color color = m_bMenuOpen ? kWhite : m_bMenuEnabled ? kBlack : kDisabledText;
+  DrawMnemonicText(surface, {m_rcTitle.left + kTitlePadding, y}, m_menu.title, color);
 }
 
 void CCommandBar::DrawTools(CSurface& surface) const {
@@ -126,21 +136,21 @@ void CCommandBar::DrawClose(CSurface& surface) const {
 /// The place that shows pressed; an empty one where nothing does.
 Rect CCommandBar::PressedPlace() const {
   if (!m_bStylusInside) return {};
-  if (m_pressed == Part::kClose) return m_rcClose;
-  return m_pressed == Part::kButton ? m_arrButtons[m_nPressedButton].place : Rect{};
+  if (m_ePressed == Part::kClose) return m_rcClose;
+  return m_ePressed == Part::kButton ? m_arrButtons[m_nPressedButton].place : Rect{};
 }
 
 void CCommandBar::OnLButtonDown(Point p) {
-  m_pressed = Part::kNone;
-  if (m_rcTitle.Contains(p)) {
+  m_ePressed = Part::kNone;
+  if (m_rcTitle.Contains(p) && m_bMenuEnabled) {
     OpenMenu();
     TheApp().Screen().Capture(*m_pMenu);
     return;
   }
-  if (m_rcClose.Contains(p)) m_pressed = Part::kClose;
+  if (m_rcClose.Contains(p)) m_ePressed = Part::kClose;
   for (std::size_t i = 0; i < m_arrButtons.size(); ++i) {
     if (m_arrButtons[i].place.Contains(p) && m_arrButtons[i].enabled) {
-      m_pressed = Part::kButton;
+      m_ePressed = Part::kButton;
       m_nPressedButton = i;
     }
   }
@@ -149,27 +159,27 @@ void CCommandBar::OnLButtonDown(Point p) {
 }
 
 void CCommandBar::OnMouseMove(Point p) {
-  const Rect place = m_pressed == Part::kClose    ? m_rcClose
-                     : m_pressed == Part::kButton ? m_arrButtons[m_nPressedButton].place
-                                                  : Rect{};
+  const Rect place = m_ePressed == Part::kClose    ? m_rcClose
+                     : m_ePressed == Part::kButton ? m_arrButtons[m_nPressedButton].place
+                                                   : Rect{};
   if (m_bStylusInside == place.Contains(p)) return;
   m_bStylusInside = place.Contains(p);
   Invalidate();
 }
 
 void CCommandBar::OnPressLost() {
-  m_pressed = Part::kNone;
+  m_ePressed = Part::kNone;
   m_bStylusInside = false;
   Invalidate();
 }
 
 void CCommandBar::OnLButtonUp(Point p) {
   OnMouseMove(p);
-  const Part released = m_bStylusInside ? m_pressed : Part::kNone;
+  const Part released = m_bStylusInside ? m_ePressed : Part::kNone;
   OnPressLost();
   if (released == Part::kClose) TheApp().Queue().Post({MessageKind::kClose, {}, 0, 0});
   if (released == Part::kButton) {
-    TheApp().Queue().PostCommand(m_arrButtons[m_nPressedButton].commandID);
+    TheApp().Queue().PostCommand(m_arrButtons[m_nPressedButton].tool.commandID);
   }
 }
 

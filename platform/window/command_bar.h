@@ -1,6 +1,7 @@
 #pragma once
 
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "platform/window/menu_window.h"
@@ -8,11 +9,17 @@
 
 namespace platform {
 
+/// A button of a tool bar; command 0 is a separator.
+struct ToolButton {
+  int commandID = 0;
+  std::string tip = {};  ///< its name and its key
+};
+
 /// A tool bar: equally large pictures side by side in one bitmap, a button for each.
 struct ToolBarTemplate {
   int bitmapID;
   Size imageSize;
-  std::vector<int> commandIDs;  ///< 0 is a separator
+  std::vector<ToolButton> buttons;
 };
 
 /// The bar above the view that holds the menu, the tool bar and the close button.
@@ -25,11 +32,13 @@ class CCommandBar : public CWindow {
   void AddAdornments();
   void LoadToolBar(const ToolBarTemplate& toolBar);
 
-  /// Asks for each button whether its command may run, and shows it.
+  /// Asks for each button whether its command may run, and for the menu whether any may, and shows
+  /// it. What is shown grey is dead until it is asked again.
   void RefreshStates();
   /// Opens the menu when the key is F10 or Alt with the letter of its title.
   bool OpenMenuByKey(const KeyStroke& stroke);
 
+  ToolTip TipAt(Point p) const override;
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
@@ -38,7 +47,7 @@ class CCommandBar : public CWindow {
 
  private:
   struct Button {
-    int commandID = 0;
+    ToolButton tool;
     CBitmap image;
     Rect place;
     bool enabled = false;
@@ -59,7 +68,8 @@ class CCommandBar : public CWindow {
   std::vector<int> m_arrSeparators;  ///< x of each
   std::unique_ptr<CMenuWindow> m_pMenu;
   bool m_bMenuOpen = false;
-  Part m_pressed = Part::kNone;
+  bool m_bMenuEnabled = false;
+  Part m_ePressed = Part::kNone;
   std::size_t m_nPressedButton = 0;
   bool m_bStylusInside = false;  ///< still on what it went down on
 };

@@ -41,6 +41,13 @@ bool CFrameWindow::ExecuteCommand(int commandID) {
   return target != nullptr;
 }
 
+std::string CFrameWindow::KeyOf(int commandID) const {
+  for (const Accelerator& accelerator : m_arrAccelerators) {
+    if (accelerator.commandID == commandID) return ChordText(accelerator.stroke);
+  }
+  return {};
+}
+
 bool CFrameWindow::OnKeyDown(const KeyStroke& stroke) {
   for (const Accelerator& accelerator : m_arrAccelerators) {
     if (accelerator.stroke == stroke) {

@@ -38,8 +38,10 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
 
   /// Whether a command may run now, asked afresh.
   bool IsCommandEnabled(int commandID);
-  /// Asks and, if it may, runs a command; answers whether it ran.
+  /// Asks and, if it may, runs a command; returns whether it ran.
   bool ExecuteCommand(int commandID);
+  /// The key that stands for a command, as a person reads it; empty for none.
+  std::string KeyOf(int commandID) const;
   /// Has the tool bar show which commands may run.
   virtual void RefreshCommandStates() {}
 

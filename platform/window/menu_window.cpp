@@ -1,6 +1,7 @@
 #include "platform/window/menu_window.h"
 
 #include <algorithm>
+#include <cctype>
 #include <utility>
 
 #include "platform/draw/look.h"
@@ -14,16 +15,27 @@ constexpr int kLineHeight = 20;
 constexpr int kSeparatorHeight = 7;
 constexpr int kIndent = 12;
 constexpr int kEdge = 2;
+constexpr int kKeyGap = 24;  ///< at least, between an item and its key
 
 int HeightOf(const MenuItem& item) { return item.commandID == 0 ? kSeparatorHeight : kLineHeight; }
 
+int WidthOf(const MenuItem& item) {
+  const int width = MeasureText(kSystemFont, WithoutMnemonic(item.text)).width;
+  const std::string key = TheApp().MainFrame()->KeyOf(item.commandID);
+  return key.empty() ? width : width + kKeyGap + MeasureText(kSystemFont, key).width;
+}
+
 }  // namespace
+
+char LetterOf(const std::string& itemText) {
+  if (const char marked = MnemonicOf(itemText); marked != 0 || itemText.empty()) return marked;
+  return static_cast<char>(std::toupper(static_cast<unsigned char>(itemText[0])));
+}
 
 Rect CMenuWindow::PlaceOf(const MenuTemplate& menu, Point at) {
   Size size{0, 2 * kEdge};
   for (const MenuItem& item : menu.items) {
-    const int width = MeasureText(kSystemFont, WithoutMnemonic(item.text)).width;
-    size.width = std::max(size.width, width + 2 * (kIndent + kEdge));
+    size.width = std::max(size.width, WidthOf(item) + 2 * (kIndent + kEdge));
     size.height += HeightOf(item);
   }
   return RectAt(at, size);
@@ -31,12 +43,13 @@ Rect CMenuWindow::PlaceOf(const MenuTemplate& menu, Point at) {
 
 CMenuWindow::CMenuWindow(const MenuTemplate& menu, Point at, std::function<void()> onClosed)
     : CTopWindow(WithoutMnemonic(menu.title), PlaceOf(menu, at), Kind::kPopup),
-      m_onClosed(std::move(onClosed)) {
+      m_fnClosed(std::move(onClosed)) {
   int y = kEdge;
   for (const MenuItem& item : menu.items) {
     const Rect place{kEdge, y, GetPlace().Width() - kEdge, y + HeightOf(item)};
-    const bool enabled = TheApp().MainFrame()->IsCommandEnabled(item.commandID);
-    m_arrLines.push_back({item, place, enabled});
+    CFrameWindow& frame = *TheApp().MainFrame();
+    m_arrLines.push_back(
+        {item, frame.KeyOf(item.commandID), place, frame.IsCommandEnabled(item.commandID)});
     y = place.bottom;
   }
 }
@@ -59,6 +72,8 @@ void CMenuWindow::DrawLine(CSurface& surface, std::size_t index) const {
   const Color color = !line.enabled ? kDisabledText : selected ? kWhite : kBlack;
   const int y = line.place.top + (kLineHeight - kSystemFont.height) / 2;
   DrawMnemonicText(surface, {line.place.left + kIndent, y}, line.item.text, color);
+  const int keyWidth = MeasureText(kSystemFont, line.key).width;
+  DrawMnemonicText(surface, {line.place.right - kIndent - keyWidth, y}, line.key, color);
 }
 
 int CMenuWindow::LineAt(Point p) const {
@@ -94,6 +109,11 @@ void CMenuWindow::OnLButtonUp(Point p) {
   if (const int line = LineAt(p); line >= 0) Choose(line);
 }
 
+/// A mouse that stays on a line leaves the highlight to the keys.
+void CMenuWindow::OnMouseHover(Point p) {
+  if (const int line = LineAt(p); std::exchange(m_nHovered, line) != line) Select(line);
+}
+
 bool CMenuWindow::OnKeyDown(const KeyStroke& stroke) {
   switch (stroke.key) {
     case Key::kUp:
@@ -123,19 +143,13 @@ bool CMenuWindow::ChooseByLetter(char letter) {
   std::vector<int> matches;
   for (int i = 1; i <= count; ++i) {
     const int line = (m_nSelected + i + count) % count;
-    if (IsFor(m_arrLines[static_cast<std::size_t>(line)], letter)) matches.push_back(line);
+    const Line& at = m_arrLines[static_cast<std::size_t>(line)];
+    if (letter != 0 && at.enabled && LetterOf(at.item.text) == letter) matches.push_back(line);
   }
   if (matches.empty()) return false;
   Select(matches.front());
   if (matches.size() == 1) Choose(matches.front());
   return true;
-}
-
-/// A letter stands for an enabled item that marks it, or that marks none and begins with it.
-bool CMenuWindow::IsFor(const Line& line, char letter) {
-  if (letter == 0 || !line.enabled || line.item.text.empty()) return false;
-  const char mnemonic = MnemonicOf(line.item.text);
-  return letter == (mnemonic != 0 ? mnemonic : line.item.text[0]);
 }
 
 void CMenuWindow::Choose(int line) {
@@ -147,7 +161,7 @@ void CMenuWindow::Choose(int line) {
 
 void CMenuWindow::Dismiss() {
   Close();
-  m_onClosed();
+  m_fnClosed();
 }
 
 }  // namespace platform

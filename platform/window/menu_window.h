@@ -20,8 +20,12 @@ struct MenuTemplate {
   std::vector<MenuItem> items;
 };
 
-/// An open menu. A chosen command is posted to the queue; then, or when it is left, the menu
-/// closes.
+/// The letter that stands for an item, as a capital: the marked one, else the first; 0 for an empty
+/// text.
+char LetterOf(const std::string& itemText);
+
+/// An open menu; at its right edge stand the keys that its items have. A chosen command is posted
+/// to the queue; then, or when it is left, the menu closes.
 class CMenuWindow : public CTopWindow {
  public:
   /// The menu opens downwards from a place on the screen. It asks which items are enabled once,
@@ -35,12 +39,14 @@ class CMenuWindow : public CTopWindow {
   void OnLButtonDown(Point p) override { Track(p); }
   void OnMouseMove(Point p) override { Track(p); }
   void OnLButtonUp(Point p) override;
+  void OnMouseHover(Point p) override;
   bool OnKeyDown(const KeyStroke& stroke) override;
   void OnPressOutside() override { Dismiss(); }
 
  private:
   struct Line {
     MenuItem item;
+    std::string key;
     Rect place;
     bool enabled = false;
   };
@@ -52,13 +58,13 @@ class CMenuWindow : public CTopWindow {
   void Select(int line);
   void Step(int direction);
   bool ChooseByLetter(char letter);
-  static bool IsFor(const Line& line, char letter);
   void Choose(int line);
   void Dismiss();
 
   std::vector<Line> m_arrLines;
-  std::function<void()> m_onClosed;
+  std::function<void()> m_fnClosed;
   int m_nSelected = -1;  ///< the highlighted line; -1: none
+  int m_nHovered = -1;   ///< the line under the mouse; -1: none
 };
 
 }  // namespace platform

@@ -28,9 +28,9 @@ void CMessageQueue::DropKeys() {
                       m_arrMessages.end());
 }
 
-void CMessageQueue::Wait() {
+void CMessageQueue::Wait(int milliseconds) {
   Collect();
-  if (m_arrMessages.empty()) TheHost().WaitEvent(-1);
+  if (m_arrMessages.empty()) TheHost().WaitEvent(milliseconds);
 }
 
 void CMessageQueue::Pause(int milliseconds) {

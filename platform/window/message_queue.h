@@ -32,8 +32,8 @@ class CMessageQueue {
   bool Peek(Message& message);
   /// Forgets the keys and texts that wait.
   void DropKeys();
-  /// Waits until there may be a message.
-  void Wait();
+  /// Waits until there may be a message, or so many milliseconds; below 0: however long it takes.
+  void Wait(int milliseconds);
   /// Waits so many milliseconds and collects what comes meanwhile.
   void Pause(int milliseconds);
 

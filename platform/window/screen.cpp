@@ -9,6 +9,7 @@ namespace platform {
 
 void CScreen::Push(CTopWindow& window) {
   LosePress();
+  DismissTip();
   m_arrWindows.push_back(&window);
   MarkStale();
 }
@@ -46,53 +47,91 @@ void CScreen::PressAt(Point at) {
   pressed.OnLButtonDown(at - pressed.ScreenOrigin());
 }
 
+void CScreen::MoveTo(Point at) {
+  if (m_pPressed != nullptr) return m_pPressed->OnMouseMove(at - m_pPressed->ScreenOrigin());
+  if (!IsTopEnabled()) return;
+  CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
+  const Point origin = window.ScreenOrigin();
+  window.OnMouseHover(at - origin);
+  const ToolTip tip = window.TipAt(at - origin);
+  TipFor({tip.text, tip.tool.Moved(origin)});
+}
+
+void CScreen::ReleaseAt(Point at) {
+  CWindow* pressed = std::exchange(m_pPressed, nullptr);
+  if (pressed != nullptr) pressed->OnLButtonUp(at - pressed->ScreenOrigin());
+}
+
+void CScreen::TipFor(const ToolTip& tip) {
+  if (m_toolTip.Hover(tip)) MarkStale();
+}
+
+void CScreen::DismissTip() {
+  if (m_toolTip.Dismiss()) MarkStale();
+}
+
 void CScreen::HandleInput(const InputEvent& event) {
-  CTopWindow* top = Top();
+  const bool moves =
+      event.kind == InputKind::kPointerMove || event.kind == InputKind::kPointerLeave;
+  if (!moves) DismissTip();
   switch (event.kind) {
     case InputKind::kPointerDown:
-      PressAt(event.at);
-      break;
+      return PressAt(event.at);
     case InputKind::kPointerMove:
-      if (m_pPressed != nullptr) m_pPressed->OnMouseMove(event.at - m_pPressed->ScreenOrigin());
-      break;
+      return MoveTo(event.at);
     case InputKind::kPointerUp:
-      if (CWindow* pressed = m_pPressed; pressed != nullptr) {
-        m_pPressed = nullptr;
-        pressed->OnLButtonUp(event.at - pressed->ScreenOrigin());
-      }
-      break;
+      return ReleaseAt(event.at);
+    case InputKind::kPointerLeave:
+      return TipFor({});
+    default:
+      if (IsTopEnabled()) HandleByTop(event);
+  }
+}
+
+void CScreen::HandleByTop(const InputEvent& event) {
+  CTopWindow& top = *Top();
+  CWindow& under = top.WindowAt(event.at - top.GetPlace().TopLeft());
+  switch (event.kind) {
     case InputKind::kWheel:
-      if (CTopWindow* window = WindowUnder(event.at); window == top && top->IsEnabled()) {
-        window->WindowAt(event.at - window->GetPlace().TopLeft()).OnMouseWheel(event.wheel);
+      if (WindowUnder(event.at) == &top) under.OnMouseWheel(event.wheel);
+      break;
+    case InputKind::kMiddleClick:
+      if (WindowUnder(event.at) == &top) {
+        under.OnMiddleClick(event.at - under.ScreenOrigin(), event.text);
       }
       break;
     case InputKind::kKey:
-      if (top != nullptr && top->IsEnabled()) top->RouteKey(event.stroke);
+      top.RouteKey(event.stroke);
       break;
     case InputKind::kText:
-      if (top != nullptr && top->IsEnabled()) top->RouteText(event.text);
+      top.RouteText(event.text);
       break;
-    case InputKind::kClose:
+    case InputKind::kComposition:
+      top.RouteComposition(event.text);
+      break;
+    default:
       break;
   }
 }
 
 void CScreen::PaintAll() {
   for (CTopWindow* window : m_arrWindows) window->PaintIfNeeded();
+  if (m_toolTip.ShowWhenDue()) MarkStale();
 }
 
 void CScreen::Present() {
   if (!m_bStale || m_arrWindows.empty()) return;
   m_bStale = false;
-  if (m_arrWindows.size() == 1) {
-    TheHost().Show(Top()->Pixels());
-    return;
-  }
+  const CBitmap& whole = Top()->Pixels();
+  // The frame alone needs no other picture than its own.
+  const bool alone = m_arrWindows.size() == 1 && TipText().empty();
+  if (alone && whole.GetSize() == m_size) return TheHost().Show(whole);
   CBitmap pixels(m_size);
   CSurface surface(pixels);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
+  m_toolTip.Draw(surface);
   TheHost().Show(pixels);
 }
 

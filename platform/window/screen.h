@@ -26,9 +26,15 @@ class CScreen {
 
   /// Something on a top-level window or in the stack has changed.
   void MarkStale() { m_bStale = true; }
+  /// Paints what needs it, and a tool tip that is due.
   void PaintAll();
   /// Shows the stack if it has changed since it was last shown.
   void Present();
+
+  /// The tool tip that is shown; empty for none.
+  std::string TipText() const { return m_toolTip.GetText(); }
+  /// Milliseconds until a tool tip is due; below 0 where none is pending.
+  int TimeToTip() const { return m_toolTip.TimeLeft(); }
 
   /// A window is being disabled or hidden: a press that it or a child of it has is lost.
   void TakePressFrom(const CWindow& window);
@@ -37,12 +43,20 @@ class CScreen {
 
  private:
   void PressAt(Point at);
+  void MoveTo(Point at);
+  void ReleaseAt(Point at);
+  bool IsTopEnabled() const { return Top() != nullptr && Top()->IsEnabled(); }
+  /// What the topmost window takes, and it alone.
+  void HandleByTop(const InputEvent& event);
+  void TipFor(const ToolTip& tip);
+  void DismissTip();
   /// Whoever has the pointer has it no more, without a release.
   void LosePress();
   CTopWindow* WindowUnder(Point at) const;
 
   Size m_size;
   std::vector<CTopWindow*> m_arrWindows;
+  CToolTipCtrl m_toolTip;
   bool m_bStale = true;
   CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
 };

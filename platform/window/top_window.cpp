@@ -9,7 +9,7 @@ namespace platform {
 CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
     : CWindow(nullptr, place),
       m_strTitle(std::move(title)),
-      m_kind(kind),
+      m_eKind(kind),
       m_pixels({place.Width(), place.Height()}) {}
 
 CTopWindow::~CTopWindow() { Close(); }
@@ -29,20 +29,25 @@ void CTopWindow::SetFocus(CWindow* child) {
   if (m_pFocus != nullptr) m_pFocus->OnFocus(true);
 }
 
-bool CTopWindow::RouteKey(const KeyStroke& stroke) {
+template <class Handler>
+bool CTopWindow::Route(Handler handler) {
   for (CWindow* window = m_pFocus != nullptr ? m_pFocus : this; window != nullptr;
        window = window->GetParent()) {
-    if (window->OnKeyDown(stroke)) return true;
+    if (handler(*window)) return true;
   }
   return false;
 }
 
+bool CTopWindow::RouteKey(const KeyStroke& stroke) {
+  return Route([&stroke](CWindow& window) { return window.OnKeyDown(stroke); });
+}
+
 bool CTopWindow::RouteText(const std::string& text) {
-  for (CWindow* window = m_pFocus != nullptr ? m_pFocus : this; window != nullptr;
-       window = window->GetParent()) {
-    if (window->OnChar(text)) return true;
-  }
-  return false;
+  return Route([&text](CWindow& window) { return window.OnChar(text); });
+}
+
+bool CTopWindow::RouteComposition(const std::string& text) {
+  return Route([&text](CWindow& window) { return window.OnComposition(text); });
 }
 
 void CTopWindow::Forget(CWindow& child) {

@@ -20,7 +20,7 @@ class CTopWindow : public CWindow {
   ~CTopWindow() override;
 
   const std::string& GetTitle() const { return m_strTitle; }
-  Kind GetKind() const { return m_kind; }
+  Kind GetKind() const { return m_eKind; }
   const CBitmap& Pixels() const { return m_pixels; }
 
   /// Puts the window on top of the stack.
@@ -33,10 +33,11 @@ class CTopWindow : public CWindow {
   CWindow* GetFocus() const { return m_pFocus; }
   /// Gives the keyboard to a child; null: to the window itself.
   void SetFocus(CWindow* child);
-  /// Hands a key to the focused child, then outwards from there; answers whether it meant
-  /// something.
+  // Hand what the keyboard brings to the focused child, then outwards from there, until it means
+  // something to a window; return whether it did.
   bool RouteKey(const KeyStroke& stroke);
   bool RouteText(const std::string& text);
+  bool RouteComposition(const std::string& text);
 
   /// A press beside a popup.
   virtual void OnPressOutside() {}
@@ -44,8 +45,11 @@ class CTopWindow : public CWindow {
   void Forget(CWindow& child);
 
  private:
+  template <class Handler>
+  bool Route(Handler handler);
+
   std::string m_strTitle;
-  Kind m_kind;
+  Kind m_eKind;
   CBitmap m_pixels;
   CWindow* m_pFocus = nullptr;
 };

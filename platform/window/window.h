@@ -5,6 +5,7 @@
 
 #include "platform/draw/surface.h"
 #include "platform/host/input.h"
+#include "platform/window/tool_tip.h"
 
 namespace platform {
 
@@ -49,26 +50,34 @@ class CWindow {
   /// The visible, enabled window under a place: a child, a child's child, or this one.
   CWindow& WindowAt(Point p);
 
-  /// Paints the background and answers true; false leaves it to the common face.
+  /// Paints the background and returns true; false leaves it to the common face.
   virtual bool OnEraseBkgnd(CSurface&) { return false; }
   virtual void OnPaint(CSurface&) {}
   virtual void OnLButtonDown(Point) {}
   /// While the button or stylus that went down in this window is down; may lie outside of it.
   virtual void OnMouseMove(Point) {}
   virtual void OnLButtonUp(Point) {}
+  /// While a mouse moves with nothing down, in the topmost window; beside it too.
+  virtual void OnMouseHover(Point) {}
+  /// What is said of the tool at a place, to a mouse that rests there.
+  virtual ToolTip TipAt(Point) const { return {}; }
   /// The press that this window had is over without a release: it was disabled or hidden meanwhile,
   /// or another window opened.
   virtual void OnPressLost() {}
   virtual void OnMouseWheel(int) {}
+  /// The middle button went down on this window; the text is what is marked on the desktop.
+  virtual void OnMiddleClick(Point, const std::string&) {}
   /// Answers whether the key meant something here; otherwise the parent is asked.
   virtual bool OnKeyDown(const KeyStroke&) { return false; }
   virtual bool OnChar(const std::string&) { return false; }
+  /// What an input method has not finished yet, each time it changes; empty: it is done with it.
+  virtual bool OnComposition(const std::string&) { return false; }
   /// The keyboard has come here or gone.
   virtual void OnFocus(bool) { Invalidate(); }
 
  private:
   friend class CTopWindow;
-  /// Paints itself and its children where needed onto the top-level window's pixels; answers
+  /// Paints itself and its children where needed onto the top-level window's pixels; returns
   /// whether anything was.
   bool PaintInto(CBitmap& pixels, Point origin, bool force);
 

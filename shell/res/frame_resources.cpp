@@ -22,19 +22,24 @@ platform::MenuTemplate MainMenu() {
 platform::ToolBarTemplate MainToolBar() {
   return {IDR_MAINFRAME,
           {16, 15},
-          {kCommandHit, kCommandStand, kSeparator, kCommandDoubleDown, kSeparator, kCommandSplit,
-           kSeparator, kCommandDeal}};
+          {{kCommandHit, "Hit (H)"},
+           {kCommandStand, "Stand (S)"},
+           {kSeparator},
+           {kCommandDoubleDown, "Double Down (D)"},
+           {kSeparator},
+           {kCommandSplit, "Split (P)"},
+           {kSeparator},
+           {kCommandDeal, "Deal (Enter)"}}};
 }
 
 std::vector<platform::Accelerator> MainAccelerators() {
   const auto ctrl = [](char letter) {
-    platform::KeyStroke stroke;
-    stroke.key = platform::Key::kCharacter;
-    stroke.character = letter;
-    stroke.ctrl = true;
-    return stroke;
+    return platform::KeyStroke{.key = platform::Key::kCharacter, .character = letter, .ctrl = true};
   };
-  return {{ctrl('N'), platform::kCommandNew}, {ctrl('O'), platform::kCommandOpen}};
+  return {{ctrl('N'), platform::kCommandNew},
+          {ctrl('O'), platform::kCommandOpen},
+          {ctrl('Q'), platform::kCommandExit},
+          {{.key = platform::Key::kF1}, kCommandHelp}};
 }
 
 }  // namespace feltside

@@ -1,11 +1,13 @@
 #pragma once
 
-#include <cstddef>
+#include <gtest/gtest.h>
+
 #include <sstream>
 #include <string>
 #include <vector>
 
 #include "engine/card_hand.h"
+#include "engine/card_text.h"
 
 namespace feltside::tests {
 
@@ -19,17 +21,14 @@ Hand MakeHand(const std::vector<int>& cards) {
   return hand;
 }
 
-/// From "TS KH A 2": a rank (A, 2 .. 9, T, J, Q, K) and a suit (C, D, H, S) each. Cards without a
-/// suit take clubs, diamonds, hearts, spades, clubs, ... by their place.
+/// From "TS 10H AC"; fails the test where a word is no card.
 template <class Hand = CCardHand>
 Hand ParseHand(const std::string& text) {
-  const std::string ranks = "A23456789TJQK";
-  const std::string suits = "CDHS";
   std::vector<int> cards;
   std::istringstream words(text);
   for (std::string word; words >> word;) {
-    const std::size_t suit = word.size() > 1 ? suits.find(word[1]) : cards.size() % suits.size();
-    cards.push_back(static_cast<int>(suit * ranks.size() + ranks.find(word[0]) + 1));
+    cards.push_back(CardFromText(word));
+    EXPECT_TRUE(IsCard(cards.back())) << word;
   }
   return MakeHand<Hand>(cards);
 }

@@ -16,11 +16,14 @@ using platform::MessageKind;
 
 Message Command(int commandID) { return {MessageKind::kCommand, {}, commandID, 0}; }
 
-/// At a place of the table.
-Message Press(int x, int y) {
+constexpr platform::Point kRaise{110, 186};
+constexpr platform::Point kHitButton{75, 12};
+constexpr platform::Point kMenuTitle{30, 12};
+
+Message Press(platform::Point at) {
   Message message;
   message.input.kind = InputKind::kPointerDown;
-  message.input.at = {x, y + platform::CFrameWindow::kBarHeight};
+  message.input.at = at;
   return message;
 }
 
@@ -38,7 +41,7 @@ class DealersTurn : public testing::Test {
   DealersTurn() {
     m_desk.Table().Stack({10, 8, 23, 15, 4, 5});
     m_desk.Command(kCommandDeal);
-    m_desk.Host().SetFrameHandler([this](auto&) { m_arrStates.push_back(m_desk.State()); });
+    m_desk.Host().SetFrameHandler([this] { m_arrStates.push_back(m_desk.State()); });
   }
 
   /// Lets the dealer play with these messages waiting behind the Stand that starts it.
@@ -46,6 +49,10 @@ class DealersTurn : public testing::Test {
     Desk::Post(Command(kCommandStand));
     for (const Message& message : waiting) Desk::Post(message);
     return m_desk.Run();
+  }
+  bool WasShown(const Json& expected) const {
+    return std::any_of(m_arrStates.begin(), m_arrStates.end(),
+                       [&](const Json& state) { return Missing(state, expected).empty(); });
   }
   void ExpectShown(const Json& expected) { EXPECT_EQ(Missing(m_arrStates.back(), expected), ""); }
 
@@ -65,12 +72,11 @@ class DealersTurn : public testing::Test {
 };
 
 TEST_F(DealersTurn, SettlesOnceWhateverWaits) {
-  EXPECT_TRUE(
-      StandBefore({Command(kCommandHit), Command(kCommandStand), Command(kCommandDoubleDown),
-                   Command(kCommandSplit), Command(kCommandDeal), Press(110, 160), Press(90, 160),
-                   Press(180, 118), Command(kCommandGameSetup), Command(kCommandTableSetup),
-                   Command(platform::kCommandNew), KeyStroke("H"), KeyStroke("Enter"),
-                   KeyStroke("+"), KeyStroke("F10"), KeyStroke("Ctrl+N")}));
+  EXPECT_TRUE(StandBefore(
+      {Command(kCommandHit), Command(kCommandStand), Command(kCommandDoubleDown),
+       Command(kCommandSplit), Command(kCommandDeal), Press(kHitButton), Press(kMenuTitle),
+       Command(kCommandGameSetup), Command(kCommandTableSetup), Command(platform::kCommandNew),
+       KeyStroke("H"), KeyStroke("Enter"), KeyStroke("+"), KeyStroke("F10"), KeyStroke("Ctrl+N")}));
   ExpectShown(m_settled);
   EXPECT_EQ(Missing(m_desk.State(), m_settled), "");
   EXPECT_EQ(platform::TheApp().Screen().Windows().size(), 1U);
@@ -79,8 +85,8 @@ TEST_F(DealersTurn, SettlesOnceWhateverWaits) {
 
 TEST_F(DealersTurn, IsOverBeforeTheProgramIsLeft) {
   EXPECT_FALSE(
-      StandBefore({Command(platform::kCommandExit), Command(kCommandDeal), Press(110, 160)}));
-  ExpectShown(m_settled);
+      StandBefore({Command(platform::kCommandExit), Command(kCommandDeal), Press(kRaise)}));
+  EXPECT_TRUE(WasShown(m_settled));
 }
 
 TEST_F(DealersTurn, IsOverBeforeTheWindowIsClosed) {
@@ -94,22 +100,38 @@ TEST_F(DealersTurn, HandlesWhatComesInItsPausesAfterwards) {
                  {"m_handDealer", {23, 15, 4}},
                  {"m_bHandInProgress", 0},
                  {"m_strDealerScore", "16"}});
-    m_desk.Host().PutPointer(InputKind::kPointerDown, {110, 186});  // raises the stake
+    for (const platform::Point at : {kRaise, kHitButton, kMenuTitle}) {
+      m_desk.Host().PutPointer(InputKind::kPointerDown, at);
+    }
     // Keys struck in impatience do nothing: the result is to be read first.
     for (const char* key : {"H", "Enter", "+"}) m_desk.Host().PutKey(key);
   });
   EXPECT_TRUE(StandBefore({}));
-  const auto settled = std::find_if(m_arrStates.begin(), m_arrStates.end(), [this](const Json& s) {
-    return Missing(s, m_settled).empty();
-  });
-  EXPECT_NE(settled, m_arrStates.end());
+  EXPECT_TRUE(WasShown(m_settled));
   ExpectShown({{"m_nBet", 10}, {"m_dWallet", 95.0}, {"m_handPlayer", {10, 8}}});
+  EXPECT_EQ(platform::TheApp().Screen().Windows().size(), 1U);
+}
+
+TEST_F(DealersTurn, HandlesATapThatWaitedForItAfterwards) {
+  EXPECT_TRUE(StandBefore({Press(kRaise)}));
+  EXPECT_TRUE(WasShown(m_settled));
+  ExpectShown({{"m_nBet", 10}, {"m_dWallet", 95.0}});
 }
 
 TEST_F(DealersTurn, ClosesAfterwardsWhenAskedInAPause) {
   m_desk.Host().SetPauseHandler([&] { m_desk.Host().PutPointer(InputKind::kClose, {}); });
   EXPECT_FALSE(StandBefore({}));
   ExpectShown(m_settled);
+}
+
+TEST(DoubleDown, IsShownBeforeTheDealerDraws) {
+  Desk desk;
+  desk.Table().Stack({6, 5, 23, 15, 9, 4, 5});
+  desk.Command(kCommandDeal);
+  std::vector<Json> states;
+  desk.Host().SetFrameHandler([&] { states.push_back(desk.State()); });
+  desk.Command(kCommandDoubleDown);
+  EXPECT_EQ(Missing(states.at(0), {{"m_handPlayer", {6, 5, 9}}, {"m_bHandInProgress", 1}}), "");
 }
 
 TEST(DealersPause, IsAsLongAsThePlaySpeedSays) {

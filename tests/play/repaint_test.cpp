@@ -13,7 +13,8 @@ void Press(Desk& desk, const std::string& key) {
   SCOPED_TRACE(key);
   platform::CBitmap last = desk.Host().Shown();
   int frames = 0;
-  desk.Host().SetFrameHandler([&](const platform::CBitmap& frame) {
+  desk.Host().SetFrameHandler([&] {
+    const platform::CBitmap& frame = desk.Host().Shown();
     EXPECT_FALSE(frame == last);
     last = frame;
     ++frames;

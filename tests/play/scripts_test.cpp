@@ -14,12 +14,7 @@ TEST_P(Scripts, RunAsWritten) { PlayScript(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(Of, Scripts,
                          testing::Values("blackjack_hands", "blackjack_table", "dialog_keys",
                                          "dialog_stylus", "high_scores", "menu", "settings",
-                                         "setup", "stylus", "video_poker"));
-
-TEST(ScriptsByKeys, RunAsWritten) {
-  PlayScript("blackjack_hands", Door::kKeys);
-  PlayScript("video_poker", Door::kKeys);
-}
+                                         "setup", "stylus", "tips", "video_poker"));
 
 }  // namespace
 }  // namespace feltside::tests

@@ -2,8 +2,11 @@
 
 #include <algorithm>
 #include <array>
+#include <map>
 #include <set>
 #include <vector>
+
+#include "stylus/stylus_words.h"
 
 namespace feltside::tests {
 namespace {
@@ -64,14 +67,15 @@ std::string WrongCommands(const Json& s) {
                        s["m_bInsuranceOffered"] == 0 && s["windows"].size() == 1;
   const Json& active = s[s["m_bPlayingSplit"] == 1 ? "m_handSplit" : "m_handPlayer"];
   const bool split = !s["m_handSplit"].empty();
-  const Json expected = {{"32771", playing && active.size() < 12},
-                         {"32772", playing},
-                         {"32775", playing && active.size() <= 2},
-                         {"32773", playing && !split && IsPair(s["m_handPlayer"])},
-                         {"32776", s["m_bHandInProgress"] == 0 && s["windows"].size() == 1}};
-  for (const auto& [command, enabled] : expected.items()) {
-    if (s["windows"].size() == 1 && s["enabled"][command] != enabled) {
-      return "command " + command + " is not " + enabled.dump() + "\n";
+  const std::map<std::string, bool> expected = {
+      {"hit", playing && active.size() < 12},
+      {"stand", playing},
+      {"double", playing && active.size() <= 2},
+      {"split", playing && !split && IsPair(s["m_handPlayer"])},
+      {"deal", s["m_bHandInProgress"] == 0 && s["windows"].size() == 1}};
+  for (const auto& [command, enabled] : expected) {
+    if (s["windows"].size() == 1 && s["enabled"][std::to_string(ToCommand(command))] != enabled) {
+      return command + (enabled ? " is disabled\n" : " is enabled\n");
     }
   }
   return {};

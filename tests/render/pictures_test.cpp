@@ -7,6 +7,7 @@
 #include <set>
 
 #include "platform/draw/resources.h"
+#include "platform/draw/text.h"
 #include "render/picture_ids.h"
 
 namespace feltside::tests {
@@ -95,17 +96,30 @@ TEST(Pictures, HaveCellsForTheTextsOfVideoPoker) {
   const auto picture = platform::DecodePicture(FileOf("", IDB_POKER_TABLE));
   ASSERT_TRUE(picture.has_value());
   struct Cell {
-    platform::Rect rect;
+    platform::Rect rect;  ///< all that is flat in the colour
     Color color = platform::kBlack;
+    platform::Point text;
+    std::vector<std::string> longest;
   };
-  // As much as a text of the usual length covers.
   for (const Cell& cell :
-       {Cell{{103, 192, 130, 207}, Rgb(82, 23, 139)}, Cell{{26, 233, 70, 248}, Rgb(20, 71, 139)},
-        Cell{{135, 235, 225, 250}, Rgb(82, 115, 132)}}) {
+       {Cell{{97, 182, 138, 213}, Rgb(82, 23, 139), {103, 192}, {"Deal", "Play"}},
+        Cell{{2, 230, 117, 254}, Rgb(20, 71, 139), {26, 233}, {"$1000000", "$-1000000"}},
+        Cell{{121, 230, 239, 254},
+             Rgb(82, 115, 132),
+             {135, 235},
+             {"Three of a Kind", "Four of a Kind", "Straight Flush", "Royal Flush"}}}) {
     for (int y = cell.rect.top; y < cell.rect.bottom; ++y) {
       for (int x = cell.rect.left; x < cell.rect.right; ++x) {
         ASSERT_EQ(platform::ToColor(picture->At({x, y})), cell.color) << x << ", " << y;
       }
+    }
+    constexpr int kClear = 2;  // around the text, so that it does not stand against an edge
+    for (const std::string& text : cell.longest) {
+      const Size size = platform::MeasureText({15, true}, text);
+      EXPECT_GE(cell.text.x, cell.rect.left + kClear);
+      EXPECT_LE(cell.text.x + size.width, cell.rect.right - kClear) << text;
+      EXPECT_GE(cell.text.y, cell.rect.top + kClear);
+      EXPECT_LE(cell.text.y + size.height, cell.rect.bottom - kClear);
     }
   }
 }

@@ -56,6 +56,11 @@ class ProgramThread {
 
 }  // namespace
 
+void DeskHost::Show(const platform::CBitmap& frame) {
+  OffscreenHost::Show(frame);
+  if (m_onFrame) m_onFrame();
+}
+
 void DeskHost::WaitEvent(int milliseconds) {
   if (milliseconds >= 0 && m_onPause) m_onPause();
   OffscreenHost::WaitEvent(milliseconds);

@@ -19,6 +19,9 @@ class DeskHost : private TemporaryFolder, public platform::OffscreenHost {
 
   /// Called whenever the program waits for a time to pass.
   void SetPauseHandler(std::function<void()> onPause) { m_onPause = std::move(onPause); }
+  /// Called after every picture that is shown.
+  void SetFrameHandler(std::function<void()> onFrame) { m_onFrame = std::move(onFrame); }
+  void Show(const platform::CBitmap& frame) override;
   void WaitEvent(int milliseconds) override;
   void PutPointer(platform::InputKind kind, platform::Point at);
   void PutKey(const std::string& chord);
@@ -26,6 +29,7 @@ class DeskHost : private TemporaryFolder, public platform::OffscreenHost {
  private:
   platform::Host& m_previous = platform::TheHost();
   std::function<void()> m_onPause;
+  std::function<void()> m_onFrame;
 };
 
 /// The game in this process, worked with messages and input from one idle moment to the next, with

@@ -1,10 +1,14 @@
 #pragma once
 
+#include <filesystem>
 #include <string>
 
 #include "platform/draw/bitmap.h"
 
 namespace feltside::tests {
+
+/// A PNG file's picture; an empty one where there is none.
+platform::CBitmap LoadPicture(const std::filesystem::path& file);
 
 /// Fails the test where two pictures differ, and leaves the actual one and the difference under
 /// this name in the folder golden-diff of the build.

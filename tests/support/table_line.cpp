@@ -3,6 +3,8 @@
 #include <sstream>
 #include <vector>
 
+#include "table/command_ids.h"
+
 namespace feltside::tests {
 namespace {
 
@@ -31,11 +33,11 @@ std::string Flags(const Json& state) {
 std::string Moves(const Json& state) {
   const Json& enabled = state["enabled"];
   if (state["m_bInsuranceOffered"] == 1) return "Insurance?";
-  const auto move = [&enabled](const char* command, const char* name) {
-    return std::string(enabled[command] ? name : "");
+  const auto move = [&enabled](int commandID, const char* name) {
+    return std::string(enabled[std::to_string(commandID)] ? name : "");
   };
-  return move("32771", "H") + move("32772", "S") + move("32775", "D") + move("32773", "P") +
-         move("32776", "Deal");
+  return move(kCommandHit, "H") + move(kCommandStand, "S") + move(kCommandDoubleDown, "D") +
+         move(kCommandSplit, "P") + move(kCommandDeal, "Deal");
 }
 
 }  // namespace

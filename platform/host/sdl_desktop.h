@@ -1,0 +1,20 @@
+#pragma once
+
+#include <SDL.h>
+
+#include "platform/draw/geometry.h"
+
+namespace platform {
+
+// What SDL does not know of the desktop that a window stands on, and only the desktop's own library
+// tells.
+
+/// Whether it can show a window on the full screen when it is asked to. On X11 that takes a window
+/// manager that says so; without one SDL would believe in a full screen that is not there.
+bool KnowsFullScreen(SDL_Window* window);
+
+/// What of a part of the desktop is there now. SDL keeps the sizes of the displays that it has seen
+/// at first.
+Rect StillThere(SDL_Window* window, const Rect& part);
+
+}  // namespace platform

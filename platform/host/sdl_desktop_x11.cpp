@@ -1,0 +1,106 @@
+#include <SDL_syswm.h>
+
+#include <algorithm>
+#include <optional>
+
+#include "platform/host/sdl_desktop.h"
+
+namespace platform {
+namespace {
+
+/// What is needed of the X library, which SDL too loads only where the desktop is one of X.
+class XLibrary {
+ public:
+  explicit XLibrary(Display* display)
+      : m_pDisplay(display), m_pLibrary(SDL_LoadObject("libX11.so.6")) {
+    Load(m_pInternAtom, "XInternAtom");
+    Load(m_pGetWindowProperty, "XGetWindowProperty");
+    Load(m_pGetGeometry, "XGetGeometry");
+    Load(m_pDefaultRootWindow, "XDefaultRootWindow");
+    Load(m_pFree, "XFree");
+  }
+  ~XLibrary() { SDL_UnloadObject(m_pLibrary); }
+  XLibrary(const XLibrary&) = delete;
+  XLibrary& operator=(const XLibrary&) = delete;
+
+  bool IsComplete() const { return m_bComplete; }
+
+  /// Whether the window manager lists a feature as supported.
+  bool DesktopSupports(const char* feature) const {
+    const Atom wanted = m_pInternAtom(m_pDisplay, feature, False);
+    const Atom list = m_pInternAtom(m_pDisplay, "_NET_SUPPORTED", False);
+    constexpr long kMostWords = 4096;
+    Atom type = 0;
+    int format = 0;
+    unsigned long count = 0;
+    unsigned long left = 0;
+    unsigned char* bytes = nullptr;
+    m_pGetWindowProperty(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), list, 0, kMostWords, False,
+                         AnyPropertyType, &type, &format, &count, &left, &bytes);
+    if (bytes == nullptr) return false;
+    constexpr int kAtomBits = 32;
+    const auto* atoms = reinterpret_cast<const Atom*>(bytes);
+    const bool found =
+        format == kAtomBits && std::find(atoms, atoms + count, wanted) != atoms + count;
+    m_pFree(bytes);
+    return found;
+  }
+
+  Size DesktopSize() const {
+    Window root = 0;
+    int x = 0;
+    int y = 0;
+    unsigned width = 0;
+    unsigned height = 0;
+    unsigned border = 0;
+    unsigned depth = 0;
+    m_pGetGeometry(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), &root, &x, &y, &width, &height,
+                   &border, &depth);
+    return {static_cast<int>(width), static_cast<int>(height)};
+  }
+
+ private:
+  template <class Function>
+  void Load(Function*& function, const char* name) {
+    function = m_pLibrary == nullptr
+                   ? nullptr
+                   : reinterpret_cast<Function*>(SDL_LoadFunction(m_pLibrary, name));
+    m_bComplete = m_bComplete && function != nullptr;
+  }
+
+  Display* m_pDisplay;
+  void* m_pLibrary;
+  bool m_bComplete = true;
+  decltype(XInternAtom)* m_pInternAtom = nullptr;
+  decltype(XGetWindowProperty)* m_pGetWindowProperty = nullptr;
+  decltype(XGetGeometry)* m_pGetGeometry = nullptr;
+  decltype(XDefaultRootWindow)* m_pDefaultRootWindow = nullptr;
+  decltype(XFree)* m_pFree = nullptr;
+};
+
+/// The X display that a window is on; null where the desktop is none of X.
+Display* DisplayOf(SDL_Window* window) {
+  SDL_SysWMinfo info;
+  SDL_VERSION(&info.version);
+  const bool onX =
+      SDL_GetWindowWMInfo(window, &info) == SDL_TRUE && info.subsystem == SDL_SYSWM_X11;
+  return onX ? info.info.x11.display : nullptr;
+}
+
+}  // namespace
+
+bool KnowsFullScreen(SDL_Window* window) {
+  Display* display = DisplayOf(window);
+  if (display == nullptr) return true;
+  const XLibrary library(display);
+  return library.IsComplete() && library.DesktopSupports("_NET_WM_STATE_FULLSCREEN");
+}
+
+Rect StillThere(SDL_Window* window, const Rect& part) {
+  Display* display = DisplayOf(window);
+  if (display == nullptr) return part;
+  const XLibrary library(display);
+  return library.IsComplete() ? part.Intersection(RectAt({}, library.DesktopSize())) : part;
+}
+
+}  // namespace platform

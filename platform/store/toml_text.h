@@ -1,0 +1,26 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "platform/store/profile.h"
+
+namespace platform {
+
+/// The integers and strings that a section of a TOML text holds; nothing where the text cannot be
+/// understood.
+std::optional<CProfileSection> ReadSection(const std::string& text, const std::string& section);
+
+struct ChangedText {
+  std::string text;
+  /// The first name whose value was not of the kind that has taken its place; empty: there is none.
+  std::string foreign;
+};
+
+/// A TOML text, which can be understood, with the changes of a section in it and all else as it was
+/// but for its form. Nothing where the outcome could not be understood again: toml++ 3.3 forgets
+/// the quotation marks of some names.
+std::optional<ChangedText> ChangeSection(const std::string& text, const std::string& section,
+                                         const CProfileSection& change);
+
+}  // namespace platform

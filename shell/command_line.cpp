@@ -1,0 +1,35 @@
+#include "shell/command_line.h"
+
+#include <cstdlib>
+#include <iostream>
+#include <string_view>
+
+namespace feltside {
+namespace {
+
+constexpr int kExitRefused = 2;
+
+constexpr char kUsage[] =
+    "Usage: feltside [--help | --version]\n"
+    "Plays blackjack and video poker in a window of its own.\n"
+    "\n"
+    "  --help     show this text and end\n"
+    "  --version  show the version and end\n";
+
+}  // namespace
+
+std::optional<int> AnswerCommandLine(int argc, char** argv) {
+  if (argc < 2) return std::nullopt;
+  const std::string_view word = argv[1];
+  if (word == "--help") {
+    std::cout << kUsage;
+  } else if (word == "--version") {
+    std::cout << "Feltside " FELTSIDE_VERSION "\n";
+  } else {
+    std::cerr << "feltside: no such option: " << word << "\nTry \"feltside --help\".\n";
+    return kExitRefused;
+  }
+  return EXIT_SUCCESS;
+}
+
+}  // namespace feltside

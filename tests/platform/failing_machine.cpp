@@ -1,0 +1,47 @@
+// These stand in place of the system's and the library's functions.
+
+#include "tests/platform/failing_machine.h"
+
+#include <sys/syscall.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdlib>
+#include <ctime>
+#include <new>
+
+using namespace feltside::tests;
+
+extern "C" ssize_t read(int descriptor, void* buffer, std::size_t size) {
+  if (!g_bReadFails) return syscall(SYS_read, descriptor, buffer, size);
+  errno = EIO;
+  return -1;
+}
+
+extern "C" int usleep(useconds_t microseconds) {
+  if (!g_bSleepsInNoTime) {
+    const timespec time{0, static_cast<long>(microseconds) * 1000};
+    return nanosleep(&time, nullptr);
+  }
+  g_nMicrosecondsSlept += microseconds;
+  return 0;
+}
+
+extern "C" int clock_gettime(clockid_t clock, timespec* time) {
+  constexpr long kSecond = 1000000000;
+  const long answer = syscall(SYS_clock_gettime, clock, time);
+  const long nanoseconds = time->tv_nsec + g_nMicrosecondsSlept * 1000;
+  time->tv_sec += nanoseconds / kSecond;
+  time->tv_nsec = nanoseconds % kSecond;
+  return static_cast<int>(answer);
+}
+
+void* operator new(std::size_t size) {
+  const bool fails = g_nAllocationsLeft > 0 && --g_nAllocationsLeft == 0;
+  void* const memory = fails ? nullptr : std::malloc(size);
+  if (memory == nullptr) throw std::bad_alloc();
+  return memory;
+}
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept { return std::malloc(size); }
+void operator delete(void* memory) noexcept { std::free(memory); }
+void operator delete(void* memory, std::size_t) noexcept { std::free(memory); }

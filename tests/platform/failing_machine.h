@@ -1,0 +1,12 @@
+#pragma once
+
+namespace feltside::tests {
+
+// A machine that fails on demand, for the whole program in which this is linked.
+
+inline bool g_bReadFails = false;
+inline int g_nAllocationsLeft = 0;      ///< the last of so many fails
+inline bool g_bSleepsInNoTime = false;  ///< usleep only moves the clock
+inline long g_nMicrosecondsSlept = 0;   ///< in that way
+
+}  // namespace feltside::tests

@@ -1,0 +1,192 @@
+// The profile where the machine fails it: nothing that was stored is lost, and the player is told.
+
+#include <fcntl.h>
+#include <gmock/gmock.h>
+#include <sys/file.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <array>
+#include <csignal>
+#include <functional>
+#include <random>
+
+#include "tests/platform/failing_machine.h"
+#include "tests/platform/profile_helpers.h"
+
+namespace feltside::tests {
+namespace {
+
+namespace fs = std::filesystem;
+using platform::OpenProfile;
+using testing::HasSubstr;
+
+TEST_F(ProfileTest, LivesWithoutAPlaceToWrite) {
+  fs::create_directories(m_file);  // where the file should be
+  EXPECT_EQ(GetInt("x"), 7);
+  EXPECT_FALSE(Store("x", 3));
+  EXPECT_TRUE(fs::is_directory(m_file));
+  // Where the folder should be.
+  WriteFile(m_folder.Path() / "file", "no folder");
+  m_pProfile = OpenProfile(m_folder.Path() / "file" / "p.toml");
+  EXPECT_EQ(GetInt("x"), 7);
+  EXPECT_FALSE(Store("x", 3));
+  // Where the fresh file is to be written.
+  const fs::path other = m_folder.Path() / "Other" / "p.toml";
+  WriteFile(other, "[S]\nx = 5\n");
+  fs::create_directories(other.string() + ".new");
+  m_pProfile = OpenProfile(other);
+  EXPECT_FALSE(Store("x", 3));
+  EXPECT_EQ(ReadFile(other), "[S]\nx = 5\n");
+}
+
+TEST_F(ProfileTest, TellsOfATroubleOnceUntilItIsOver) {
+  EXPECT_TRUE(Store("x", 1));
+  fs::create_directories(m_file.string() + ".new");
+  EXPECT_FALSE(Store("x", 2));
+  EXPECT_FALSE(Store("y", 2));
+  const auto troubles = m_pProfile->TakeTroubles();
+  ASSERT_EQ(troubles.size(), 1U);
+  EXPECT_THAT(troubles[0], HasSubstr(m_file.string() + " cannot be written: File exists."));
+  EXPECT_FALSE(Store("x", 2));
+  EXPECT_TRUE(m_pProfile->TakeTroubles().empty());
+  fs::remove(m_file.string() + ".new");
+  EXPECT_TRUE(Store("x", 2));
+  fs::create_directories(m_file.string() + ".new");
+  EXPECT_FALSE(Store("x", 3));
+  EXPECT_EQ(m_pProfile->TakeTroubles(), troubles);
+}
+
+TEST_F(ProfileTest, TakesAReadErrorForNoEmptyFile) {
+  EXPECT_TRUE(Store("x", 1));
+  g_bReadFails = true;
+  EXPECT_EQ(GetInt("x"), 7);
+  EXPECT_EQ(m_pProfile->TakeTroubles().size(), 1U);
+  EXPECT_FALSE(Store("y", 2));
+  g_bReadFails = false;
+  EXPECT_EQ(GetInt("x"), 1);
+}
+
+TEST_F(ProfileTest, StoresAllOrNothingWhenMemoryRunsOut) {
+  const std::string before = "[S]\nname = \"" + std::string(100, 'n') + "\"\nx = 1\n";
+  bool stored = false;
+  for (int allocations = 1; !stored; ++allocations) {
+    WriteFile(m_file, before);
+    m_pProfile = OpenProfile(m_file);
+    g_nAllocationsLeft = allocations;
+    const int read = GetInt("x");
+    g_nAllocationsLeft = 0;
+    EXPECT_TRUE(read == 1 || !m_pProfile->TakeTroubles().empty()) << allocations;
+    g_nAllocationsLeft = allocations;
+    stored = Store("y", 2);
+    g_nAllocationsLeft = 0;
+    ASSERT_EQ(ReadFile(m_file), stored ? before + "y = 2\n" : before) << allocations;
+  }
+  EXPECT_TRUE(KeptCopies().empty());
+}
+
+class LongNameTest : public ProfileTest {
+ protected:
+  /// Too long for anything behind it but ".new" and ".lock".
+  LongNameTest() : ProfileTest(std::string(248, 'n')) {}
+};
+
+TEST_F(LongNameTest, DestroysNothingThatCannotBeKept) {
+  for (const char* text : {"[S", "S = 3\n", "[S]\nx = 'text'\n"}) {
+    WriteFile(m_file, text);
+    EXPECT_EQ(GetInt("x"), 7);
+    EXPECT_FALSE(Store("x", 4));
+    EXPECT_EQ(ReadFile(m_file), text);
+    EXPECT_FALSE(m_pProfile->TakeTroubles().empty());
+    EXPECT_EQ(std::distance(fs::directory_iterator(m_file.parent_path()), {}), 2);
+  }
+}
+
+TEST_F(ProfileTest, WaitsNoMoreThanASecondForAGameThatHasStopped) {
+  EXPECT_TRUE(Store("x", 1));
+  const int lock = open((m_file.string() + ".lock").c_str(), O_RDWR);
+  ASSERT_EQ(flock(lock, LOCK_EX), 0);
+  g_bSleepsInNoTime = true;
+  EXPECT_FALSE(Store("x", 2));
+  EXPECT_EQ(GetInt("x"), 1);
+  EXPECT_GE(g_nMicrosecondsSlept, 900000);
+  EXPECT_LE(g_nMicrosecondsSlept, 1000000);
+  WriteFile(m_file, "[S");
+  EXPECT_EQ(GetInt("x"), 7);
+  EXPECT_EQ(ReadFile(m_file), "[S");  // not while the other one may be about to replace it
+  EXPECT_LE(g_nMicrosecondsSlept, 2000000);
+  g_bSleepsInNoTime = false;
+  close(lock);
+  EXPECT_TRUE(Store("x", 3));
+}
+
+/// Runs a function in a process of its own.
+pid_t InChild(const std::function<void()>& run) {
+  const pid_t child = fork();
+  if (child == 0) {
+    run();
+    _exit(0);
+  }
+  return child;
+}
+
+TEST_F(ProfileTest, LosesNothingWhenTwoProgramsWriteAtOnce) {
+  constexpr int kWrites = 100;
+  const auto write = [this](const std::string& name) {
+    for (int i = 0; i < kWrites; ++i) {
+      while (!Store(name + std::to_string(i), i)) continue;  // the other one is too busy
+    }
+  };
+  const pid_t child = InChild([&] { write("child"); });
+  write("parent");
+  waitpid(child, nullptr, 0);
+  for (int i = 0; i < kWrites; ++i) {
+    EXPECT_EQ(GetInt("parent" + std::to_string(i)), i);
+    EXPECT_EQ(GetInt("child" + std::to_string(i)), i);
+  }
+}
+
+TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
+  const std::string a(20000, 'a');
+  const std::string b(20000, 'b');
+  const auto write = [this](const std::string& text) {
+    return m_pProfile->Update("S", [&](auto& section) {
+      section.Set("text", text);
+      section.Set("twin", text);
+    });
+  };
+  Store("other", 5);
+  write(a);
+  std::mt19937 random(11);
+  for (int i = 0; i < 50; ++i) {
+    std::array<int, 2> beat{};
+    ASSERT_EQ(pipe(beat.data()), 0);
+    const pid_t child = InChild([&] {
+      for (;;) {
+        for (const std::string& text : {b, a}) {
+          if (::write(beat[1], "x", 1) != 1) return;
+          write(text);
+        }
+      }
+    });
+    char sign = 0;
+    for (auto beats = 1 + random() % 4; beats > 0; --beats) {
+      ASSERT_EQ(read(beat[0], &sign, 1), 1);
+    }
+    // Somewhere in the midst of a write.
+    for (auto turns = random() % 200; turns > 0; --turns) sched_yield();
+    kill(child, SIGKILL);
+    waitpid(child, nullptr, 0);
+    close(beat[0]);
+    close(beat[1]);
+    const std::string text = GetString("text");
+    ASSERT_TRUE(text == a || text == b) << text.size();
+    ASSERT_EQ(GetString("twin"), text);
+    ASSERT_EQ(GetInt("other"), 5);
+    ASSERT_TRUE(write(a));  // nobody holds the lock
+  }
+  EXPECT_TRUE(KeptCopies().empty());
+}
+
+}  // namespace
+}  // namespace feltside::tests

@@ -1,0 +1,98 @@
+// The windows of the layer by themselves, without the game.
+
+#include <gtest/gtest.h>
+
+#include "platform/dialog/combo_box.h"
+#include "platform/dialog/message_box.h"
+#include "platform/window/application.h"
+#include "tests/support/desk.h"
+#include "tests/support/script.h"
+
+namespace feltside::tests {
+namespace {
+
+using platform::InputKind;
+
+constexpr platform::Size kScreen{240, 294};
+
+/// A program that does one thing and ends.
+class App : public platform::CApplication {
+ public:
+  explicit App(std::function<void()> act)
+      : CApplication("Test", {}, kScreen), m_fnAct(std::move(act)) {}
+
+ protected:
+  bool InitInstance() override {
+    m_fnAct();
+    return false;
+  }
+
+ private:
+  std::function<void()> m_fnAct;
+};
+
+TEST(Screen, TakesInputWithNoWindowOpen) {
+  platform::CScreen screen(kScreen);
+  for (int kind = 0; kind <= static_cast<int>(InputKind::kClose); ++kind) {
+    screen.HandleInput({static_cast<InputKind>(kind), {}, 1, {}, {}});
+  }
+}
+
+TEST(Screen, IsShownWholeWithASmallWindowAlone) {
+  DeskHost host;
+  host.SetFrameHandler([&host] { EXPECT_EQ(host.Shown().GetSize(), kScreen); });
+  App([] { platform::MessageBox("Too early"); }).Main();
+  EXPECT_EQ(host.Shown().GetSize(), kScreen);
+}
+
+platform::CBitmap ShotAfter(const std::vector<std::string>& commands) {
+  Stylus stylus;
+  for (const std::string& command : commands) Do(stylus, command);
+  return stylus.Shot();
+}
+
+TEST(Windows, LeaveNothingBehindThemWhenTheyGo) {
+  using Commands = std::vector<std::string>;
+  const std::string cards = "stack TH 2D KS 7C 2C 2H";
+  const std::vector<std::pair<Commands, Commands>> cases = {
+      {{"command 32777", "key Tab", "key Tab"},
+       {"command 32777", "key Tab", "key Tab", "key F4", "key Escape"}},
+      {{}, {"key F10", "key Escape"}},
+      {{}, {"command 32779", "down 55 26", "move 300 300", "up 300 300", "key Escape"}},
+      {{}, {"down 186 12", "up 5 200"}},
+      {{cards, "command 32776", "key H", "key H"},
+       {cards, "command 32776", "key H", "down 75 12", "up 75 12"}}};
+  for (const auto& [without, with] : cases) {
+    EXPECT_TRUE(ShotAfter(with).Pixels() == ShotAfter(without).Pixels())
+        << testing::PrintToString(with);
+  }
+}
+
+class OneList : public platform::CDialog {
+ public:
+  OneList()
+      : CDialog({"", 100, 100, {{platform::ControlKind::kComboBox, 7, "", {5, 5, 90, 60}}}}) {}
+  void OnSelChange(int) override { ADD_FAILURE(); }
+};
+
+TEST(ComboBox, HasNothingToChooseWhileItIsEmpty) {
+  DeskHost host;
+  for (const char* key : {"Down", "Up", "Home", "End", "A", "F4", "Down", "End", "Enter"}) {
+    host.PutKey(key);
+  }
+  App([] {
+    OneList dialog;
+    dialog.DoModal();
+    EXPECT_EQ(dialog.GetDlgItem(7)->GetValue(), -1);
+  }).Main();
+}
+
+TEST(Menu, KnowsAnItemByItsMarkedLetterElseByItsFirst) {
+  for (const auto& [text, letter] : std::vector<std::pair<std::string, char>>{
+           {"E&xit", 'X'}, {"Help...", 'H'}, {"help", 'H'}, {"7 up", '7'}, {"", 0}}) {
+    EXPECT_EQ(platform::LetterOf(text), letter) << text;
+  }
+}
+
+}  // namespace
+}  // namespace feltside::tests
