@@ -102,7 +102,7 @@ def smiley():
 
     card = _panel(dots, "blue_dark")
     _centred(card, 11, "smiley", {"#": "ink", "y": "gold_light", "g": "gold", "o": "orange",
-                                 "p": "gold_pale", "w": "white", "r": "red"})
+                                  "p": "gold_pale", "w": "white", "r": "red"})
     return card
 
 

@@ -130,7 +130,8 @@ class Checker:
         one.)"""
         for match in re.finditer(r"^using (?:\w+::)+(\w+);$", text, re.MULTILINE):
             if len(re.findall(rf"\b{match[1]}\b", without_comments(text))) == 1:
-                self.fault(path, 1 + text.count("\n", 0, match.start()), f"has no use for {match[1]}")
+                number = 1 + text.count("\n", 0, match.start())
+                self.fault(path, number, f"has no use for {match[1]}")
 
     def check_game(self, path, text):
         """The layer knows no game, not even by name."""

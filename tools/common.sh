@@ -1,3 +1,4 @@
+# shellcheck shell=bash
 # What the commands at the top folder have in common. Sourced by bash there.
 
 say() { printf '%s: %s\n' "${0##*/}" "$*"; }
@@ -22,4 +23,12 @@ build() {
 say_faults() {
   grep -E -A 3 -m 8 'error:|Error|FAILED|not found' "$1" >&2
   say "all that was said is in $1" >&2
+}
+
+# system_python WORD...: the Python that the system's packages are for, which need not be the first in
+# the path.
+system_python() {
+  local python=/usr/bin/python3
+  [ -x $python ] || python=python3
+  $python "$@"
 }

@@ -1,3 +1,4 @@
+# shellcheck shell=bash
 # What to install, read from where it stands: debian/control. Sourced by bash at the top folder of the
 # project.
 
