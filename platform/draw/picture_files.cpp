@@ -19,28 +19,18 @@ png_image StartImage() {
   return image;
 }
 
-/// Reads the pixels of a picture whose head has been read; the library frees what it holds of it.
-std::optional<CBitmap> FinishReading(png_image& image) {
-  image.format = kPixelFormat;
-  CBitmap bitmap({static_cast<int>(image.width), static_cast<int>(image.height)});
-  const int read = png_image_finish_read(&image, nullptr, bitmap.Data(),
-                                         static_cast<png_int_32>(image.width) * 4, nullptr);
-  if (read == 0) return std::nullopt;
-  return bitmap;
-}
-
 }  // namespace
 
 std::optional<CBitmap> DecodePicture(const EmbeddedFile& file) {
   png_image image = StartImage();
   if (png_image_begin_read_from_memory(&image, file.data, file.size) == 0) return std::nullopt;
-  return FinishReading(image);
-}
-
-std::optional<CBitmap> LoadPng(const std::string& path) {
-  png_image image = StartImage();
-  if (png_image_begin_read_from_file(&image, path.c_str()) == 0) return std::nullopt;
-  return FinishReading(image);
+  image.format = kPixelFormat;
+  CBitmap bitmap({static_cast<int>(image.width), static_cast<int>(image.height)});
+  // The library frees what it holds of the picture.
+  const int read = png_image_finish_read(&image, nullptr, bitmap.Data(),
+                                         static_cast<png_int_32>(image.width) * 4, nullptr);
+  if (read == 0) return std::nullopt;
+  return bitmap;
 }
 
 bool SavePng(const CBitmap& bitmap, const std::string& path) {

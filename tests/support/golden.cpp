@@ -6,6 +6,7 @@
 #include <filesystem>
 
 #include "platform/draw/resources.h"
+#include "tests/support/temporary_folder.h"
 
 namespace feltside::tests {
 namespace {
@@ -29,6 +30,12 @@ CBitmap DifferenceOf(const CBitmap& actual, const CBitmap& stored, int& count) {
 
 }  // namespace
 
+CBitmap ReadPicture(const fs::path& path) {
+  const std::string bytes = ReadFile(path);
+  const auto* data = reinterpret_cast<const unsigned char*>(bytes.data());
+  return platform::DecodePicture({"", data, bytes.size()}).value_or(CBitmap());
+}
+
 void ExpectSame(const CBitmap& actual, const CBitmap& expected, const std::string& name) {
   if (expected == actual) return;
   int count = 0;
@@ -48,7 +55,7 @@ void ExpectGolden(const CBitmap& actual, const std::string& name) {
     return;
   }
   SCOPED_TRACE("stored as " + golden + "; FELTSIDE_RENEW_GOLDEN=1 renews it");
-  ExpectSame(actual, platform::LoadPng(golden).value_or(CBitmap()), name);
+  ExpectSame(actual, ReadPicture(golden), name);
 }
 
 }  // namespace feltside::tests

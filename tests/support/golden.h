@@ -1,10 +1,14 @@
 #pragma once
 
+#include <filesystem>
 #include <string>
 
 #include "platform/draw/bitmap.h"
 
 namespace feltside::tests {
+
+/// The picture in a PNG file; an empty one where there is none.
+platform::CBitmap ReadPicture(const std::filesystem::path& path);
 
 /// Fails the test where two pictures differ, and leaves the actual one and the difference under
 /// this name in the folder golden-diff of the build.

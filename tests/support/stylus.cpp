@@ -10,7 +10,7 @@
 #include <memory>
 #include <stdexcept>
 
-#include "platform/draw/resources.h"
+#include "tests/support/golden.h"
 
 namespace feltside::tests {
 namespace {
@@ -67,7 +67,7 @@ Json Stylus::Send(const std::string& line) {
 platform::CBitmap Stylus::Shot() {
   const std::string file = m_folder.Path() / "shot.png";
   Send("shot " + file);
-  return platform::LoadPng(file).value();
+  return ReadPicture(file);
 }
 
 std::filesystem::path Stylus::ProfileFile() const {
