@@ -11,6 +11,7 @@ is_there() {
   case $1 in
     command) command -v "$2" ;;
     module) pkg-config --exists "$2" ;;
+    header) c++ -fsyntax-only -x c++ -include "$2" /dev/null ;;
     font) ls /usr/share/fonts/truetype/liberation/"$2" || ls /usr/share/fonts/liberation/"$2" ;;
     python) python3 -c "import $2" ;;
     helper) true ;;
