@@ -45,14 +45,16 @@ void CEditBox::OnPaint(CSurface& surface) {
   const int top = TextTop(client);
   // Of a long text only the piece around the box is drawn.
   const std::size_t from = FittingLength(kSystemFont, GetText(), m_nScroll - kPadding);
-  const std::string rest = GetText().substr(from);
-  const CBitmap stencil =
-      RenderText(kSystemFont, rest.substr(0, FittingLength(kSystemFont, rest, 2 * client.right)));
+  std::string piece = GetText().substr(from);
+  piece.resize(FittingLength(kSystemFont, piece, 2 * client.right));
+  const CBitmap stencil = RenderText(kSystemFont, piece);
+  // Its first letter may stand closer to the one before it than at the start of a text.
+  const int left = CaretX(from + piece.size()) - stencil.GetSize().width;
   // What is drawn within the border must not run over it.
   CBitmap pixels({client.right - 2, client.bottom - 2}, kWhite);
   CSurface inner(pixels);
   const Point shift{-1, -1};
-  inner.DrawStencil(Point{CaretX(from), top} + shift, stencil, kBlack);
+  inner.DrawStencil(Point{left, top} + shift, stencil, kBlack);
   if (HasFocus()) {
     if (m_nCaret != m_nAnchor) {
       // A pixel more on every side, so that no light letter touches the light box.
@@ -63,7 +65,7 @@ void CEditBox::OnPaint(CSurface& surface) {
       inner.FillRect(marked, kHighlight);
       CSurface highlighted(pixels, marked.Common(pixels.Bounds()));
       const Point origin = marked.Common(pixels.Bounds()).TopLeft();
-      highlighted.DrawStencil(Point{CaretX(from), top} + shift - origin, stencil, kWhite);
+      highlighted.DrawStencil(Point{left, top} + shift - origin, stencil, kWhite);
     }
     const int x = CaretX(m_nCaret) - 1 + shift.x;
     inner.FillRect({x, top - 2, x + 1, top + kSystemFont.height}, kBlack);
