@@ -44,7 +44,7 @@ JSON = r"nlohmann/.*"
 
 # The same for the headers of libraries.
 LIBRARIES = [
-    (r"platform/draw/\w+\.cpp", r"png\.h|freetype/.*|utf8.*"),
+    (r"platform/draw/\w+\.cpp", r"png\.h|freetype/.*|utf8cpp/.*"),
     (r"platform/host/sdl_\w+\.h", SDL),
     (r"platform/host/\w+\.cpp", f"{SDL}|malloc\\.h|{SYSTEM}"),
     (r"platform/store/\w+\.cpp", rf"toml\+\+/.*|{SYSTEM}"),
@@ -56,7 +56,7 @@ LIBRARIES = [
 ]
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
-LIBRARY_NAME = re.compile(r"\b(?:SDL|FT|png)_\w+|\btoml::\w+")
+LIBRARY_NAME = re.compile(r"\b(?:SDL|FT|png)_\w+|\b(?:toml|utf8)::\w+")
 
 
 def source_files():

@@ -10,7 +10,7 @@ namespace platform {
 namespace {
 
 constexpr int kBoxSize = 13;
-constexpr int kTextLeft = kBoxSize + 5;
+constexpr int kTextLeft = kBoxSize + 3;
 
 }  // namespace
 

@@ -59,10 +59,11 @@ void CEditBox::DrawShown(CSurface& inside) {
   const int bottom = top + kSystemFont.height;
   // Of a long text only the piece around the box is drawn.
   const std::size_t from = FittingLength(kSystemFont, Shown(), m_nScroll - kPadding);
-  const std::string rest = Shown().substr(from);
-  const CBitmap stencil = RenderText(
-      kSystemFont, rest.substr(0, FittingLength(kSystemFont, rest, 2 * GetClientRect().right)));
-  const Point at{CaretX(from), top};
+  std::string piece = Shown().substr(from);
+  piece.resize(FittingLength(kSystemFont, piece, 2 * GetClientRect().right));
+  const CBitmap stencil = RenderText(kSystemFont, piece);
+  // Its first letter may stand closer to the one before it than at the start of a text.
+  const Point at{CaretX(from + piece.size()) - stencil.GetSize().width, top};
   inside.DrawStencil(at, stencil, kBlack);
   if (!HasFocus()) return;
   if (m_nCaret != m_nAnchor) {

@@ -45,6 +45,9 @@ class CBitmap {
   friend bool operator==(const CBitmap&, const CBitmap&) = default;
 
  private:
+  std::size_t Count() const {
+    return static_cast<std::size_t>(m_size.width) * static_cast<std::size_t>(m_size.height);
+  }
   std::size_t Index(Point p) const {
     return static_cast<std::size_t>(p.y) * static_cast<std::size_t>(m_size.width) +
            static_cast<std::size_t>(p.x);

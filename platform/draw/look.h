@@ -32,7 +32,7 @@ void DrawMnemonicText(CSurface& surface, Point at, const std::string& text, Colo
 /// A text without its mnemonic signs.
 std::string WithoutMnemonic(const std::string& text);
 
-/// The letter after the single '&' as a capital, or 0.
+/// The ASCII letter after the single '&' as a capital; '\0' where there is none.
 char MnemonicOf(const std::string& text);
 
 /// A picture in the grey of what is disabled, without its white.

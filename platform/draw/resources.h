@@ -15,8 +15,8 @@ class CResources {
  public:
   explicit CResources(EmbeddedFiles files) : m_files(files) {}
 
-  /// The bitmap of that number. Where there is none, or it cannot be decoded: a framed blank of the
-  /// given size that bears the number, the same from then on.
+  /// The bitmap of that number, which lives as long as this. Where there is none, or it cannot be
+  /// decoded: a framed blank of the given size that bears the number, the same from then on.
   const CBitmap& LoadBitmap(int resourceID, Size blank);
   /// The same for who keeps it: decoded for this call alone.
   CBitmap ReadBitmap(int resourceID, Size blank) const;
@@ -34,7 +34,7 @@ class CResources {
   std::map<std::string, CBitmap> m_mapLoaded;
 };
 
-/// A picture of a file that could be read; nothing otherwise.
+/// The picture in a PNG file, whatever its colour type; nothing where it cannot be read.
 std::optional<CBitmap> DecodePicture(const EmbeddedFile& file);
 
 /// Writes a bitmap as a PNG file; answers whether it was written.

@@ -15,14 +15,18 @@ struct Font {
   bool bold = false;
 };
 
-/// The extent of a UTF-8 text; an empty text is 0 wide and a cell high.
+/// The extent of a UTF-8 text in pixels, from its first letter's ink or pen to the last one's; an
+/// empty text is 0 wide and a cell high. A text's width is not the sum of its parts': letters are
+/// moved closer or apart by their neighbours.
 Size MeasureText(const Font& font, const std::string& text);
 
-/// How much of a text, in bytes and whole letters from its start, is at most so many pixels wide.
+/// How much of a text, in bytes and whole letters from its start, MeasureText calls at most so many
+/// pixels wide; 0 for a width below 0.
 std::size_t FittingLength(const Font& font, const std::string& text, int width);
 
 /// The text as a stencil of its extent: opaque pixels where ink stands, see-through ones elsewhere.
-/// A letter that the face lacks shows as a box.
+/// A letter that the face lacks shows as a box; one that memory does not suffice for is left out,
+/// and shows the next time.
 CBitmap RenderText(const Font& font, const std::string& text);
 
 }  // namespace platform

@@ -5,6 +5,8 @@
 
 namespace platform {
 
+// Places in a text are counted in bytes.
+
 /// Where the letter before a place in a UTF-8 text begins; 0 at the start.
 std::size_t PreviousLetter(const std::string& text, std::size_t at);
 

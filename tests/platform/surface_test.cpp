@@ -12,18 +12,6 @@ namespace {
 
 using namespace platform;
 
-TEST(Text, HasExactCellHeights) {
-  for (const int height : {11, 13, 14, 15, 22}) {
-    for (const bool bold : {false, true}) {
-      const Font font{height, bold};
-      EXPECT_EQ(MeasureText(font, ""), (Size{0, height}));
-      EXPECT_EQ(RenderText(font, "Player").GetSize(), MeasureText(font, "Player"));
-      EXPECT_GE(MeasureText({height, true}, "Player").width, MeasureText(font, "Player").width);
-    }
-    EXPECT_NE(RenderText({height, true}, "Player"), RenderText({height, false}, "Player"));
-  }
-}
-
 TEST(Resources, ShowABlankWithItsNumberForAPictureThatIsMissing) {
   CResources none({nullptr, 0});
   CBitmap expected({29, 41});

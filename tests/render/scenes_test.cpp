@@ -89,7 +89,7 @@ Texts LinesOf(const Json& control, const Rect& place) {
   const int number = control["number"];
   // A patch hides its text; what is too long for a list line or an edit is cut there.
   if (kind == "patch" || kind == "edit" || (number >= 6009 && number <= 6013)) return {};
-  const int other = kind == "button" ? 4 : kind == "check" ? 19 : kind == "list" ? 21 : 0;
+  const int other = kind == "button" ? 4 : kind == "check" ? 17 : kind == "list" ? 21 : 0;
   Texts lines = platform::WrapText(control["text"], place.Width() - other);
   EXPECT_LE(static_cast<int>(lines.size()) * kSystemFont.height, place.Height()) << control;
   for (const std::string& line : lines) {
