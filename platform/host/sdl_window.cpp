@@ -22,18 +22,20 @@ Size SizeOf(const Rect& rect) { return {rect.Width(), rect.Height()}; }
 
 Rect ToRect(const SDL_Rect& rect) { return RectAt({rect.x, rect.y}, {rect.w, rect.h}); }
 
-/// What windows may cover of each display.
-std::vector<Rect> UsableDisplays() {
+using Bounds = decltype(SDL_GetDisplayBounds);
+
+/// All displays, by what SDL answers of each: all of it, or what panels leave to windows.
+std::vector<Rect> Displays(Bounds* boundsOf) {
   std::vector<Rect> displays;
   for (int i = 0; i < SDL_GetNumVideoDisplays(); ++i) {
     SDL_Rect bounds;
-    if (SDL_GetDisplayUsableBounds(i, &bounds) == 0) displays.push_back(ToRect(bounds));
+    if (boundsOf(i, &bounds) == 0) displays.push_back(ToRect(bounds));
   }
   return displays;
 }
 
 Size ComfortableSize(Size frame) {
-  const std::vector<Rect> displays = UsableDisplays();
+  const std::vector<Rect> displays = Displays(SDL_GetDisplayUsableBounds);
   if (displays.empty()) return frame;
   const auto comfortable = [](int side) {
     return std::max(1, std::min(side * kComfortablePercent / 100, side - 2 * kTitleBar));
@@ -110,9 +112,20 @@ void SdlWindow::PutAt(const Rect& rect) {
   if (at != rect.TopLeft()) SDL_SetWindowPosition(m_pWindow, at.x, at.y);
 }
 
+/// Whoever leaves a window under a panel finds it there again: desktops have one measure for the
+/// panels of all displays. One that must be moved stands clear of them.
+Rect SdlWindow::OnDesktop(const Rect& rect) const {
+  const auto onto = [this, &rect](Bounds* boundsOf) {
+    std::vector<Rect> displays = Displays(boundsOf);
+    for (Rect& display : displays) display = StillThere(m_pWindow, display);
+    return MovedOnto(displays, rect);
+  };
+  return onto(SDL_GetDisplayBounds) == rect ? rect : onto(SDL_GetDisplayUsableBounds);
+}
+
 void SdlWindow::SetPlace(const WindowPlace& place) {
   m_bPlaced = true;
-  PutAt(MovedOnto(UsableDisplays(), place.rect));
+  PutAt(OnDesktop(place.rect));
   m_rcAsked = m_rcNormal = CurrentRect();
   m_bOpensMaximized = place.maximized;
 }
@@ -138,7 +151,7 @@ void SdlWindow::Appear() {
   SDL_ShowWindow(m_pWindow);
   SDL_PumpEvents();
   m_rcOpened = CurrentRect();
-  const Rect inside = MovedOnto(UsableDisplays(), m_rcOpened);
+  const Rect inside = OnDesktop(m_rcOpened);
   if (inside != m_rcOpened) PutAt(inside);
   m_rcNormal = CurrentRect();
   if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
@@ -176,6 +189,11 @@ bool SdlWindow::IsMaximized() const {
                         : (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_MAXIMIZED) != 0;
 }
 
+int SdlWindow::BarHeight() const {
+  const int height = m_rcOpened.top - m_rcAsked.top;
+  return height > 0 && height <= 2 * kTitleBar ? height : 0;
+}
+
 void SdlWindow::ToggleFullScreen() {
   if (IsFullScreen()) {
     LeaveFullScreen();
@@ -196,22 +214,13 @@ void SdlWindow::EnterFullScreen() {
   PutAt(StillThere(m_pWindow, ToRect(display)));
 }
 
-/// The display may have become smaller meanwhile: the window manager says so, or has made the
-/// window smaller with it.
-std::vector<Rect> SdlWindow::RoomBehindFullScreen() const {
-  const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
-  std::vector<Rect> room;
-  for (Rect display : UsableDisplays()) {
-    display = StillThere(m_pWindow, display.Intersection(CurrentRect()));
-    if (bar.y > 0 && bar.y <= kTitleBar * 2) display.top += bar.y;
-    if (!display.IsEmpty()) room.push_back(display);
-  }
-  return room;
-}
-
+/// The display may have become smaller meanwhile.
 void SdlWindow::LeaveFullScreen() {
   const Rect display = CurrentRect();
-  const Rect back = MovedOnto(RoomBehindFullScreen(), m_rcNormal);
+  Rect back = m_rcNormal;
+  back.top -= BarHeight();
+  back = OnDesktop(back);
+  back.top += BarHeight();
   if (!m_bFillsDisplay) SDL_SetWindowFullscreen(m_pWindow, 0);
   m_bFillsDisplay = false;
   if (m_bMaximizedBefore) {
