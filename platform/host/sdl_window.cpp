@@ -1,6 +1,7 @@
 #include "platform/host/sdl_window.h"
 
 #include <algorithm>
+#include <string_view>
 
 #include "platform/host/frame_scaling.h"
 #include "platform/host/sdl_desktop.h"
@@ -44,6 +45,9 @@ Size ComfortableSize(Size frame) {
                      kFirstLeastPercent);
 }
 
+/// Wayland tells no program where its windows stand; what SDL makes up changes by itself.
+bool KnowsPlaces() { return std::string_view(SDL_GetCurrentVideoDriver()) != "wayland"; }
+
 void SetIcon(SDL_Window* window, const CBitmap& icon) {
   std::vector<Pixel> pixels = icon.Pixels();
   const Size size = icon.GetSize();
@@ -82,7 +86,11 @@ bool SdlWindow::Open(bool plain) {
                        SDL_WINDOW_HIDDEN | SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
   if (m_pWindow == nullptr) return false;
   SDL_SetWindowMinimumSize(m_pWindow, m_frameSize.width / 2, m_frameSize.height / 2);
-  return m_canvas.Open(m_pWindow, plain);
+  if (!m_canvas.Open(m_pWindow, plain)) return false;
+  // A sharp display has a larger multiple of its own that may fill a little less.
+  const SDL_Rect picture = WindowRect(RectAt({}, m_frameSize));
+  SDL_SetWindowSize(m_pWindow, picture.w, picture.h);
+  return true;
 }
 
 void SdlWindow::Close() {
@@ -99,7 +107,7 @@ void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitma
 Rect SdlWindow::CurrentRect() const {
   Point at;
   Size size;
-  SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
+  if (KnowsPlaces()) SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
   SDL_GetWindowSize(m_pWindow, &size.width, &size.height);
   return RectAt(at, size);
 }
@@ -125,8 +133,8 @@ Rect SdlWindow::OnDesktop(const Rect& rect) const {
 
 void SdlWindow::SetPlace(const WindowPlace& place) {
   m_bPlaced = true;
-  PutAt(OnDesktop(place.rect));
-  m_rcAsked = m_rcNormal = CurrentRect();
+  m_rcAsked = OnDesktop(place.rect);
+  PutAt(m_rcAsked);
   m_bOpensMaximized = place.maximized;
 }
 
