@@ -14,7 +14,8 @@ std::filesystem::path HelpPage(const std::vector<std::filesystem::path>& folders
                                const std::string& commandLine);
 
 /// Shows a help page in the desktop's own browser, as a process that nothing waits for; false where
-/// the page or the program that opens it is not there. Whether a browser then comes up is not known.
+/// the page or the program that opens it is not there. Whether a browser then comes up is not
+/// known.
 bool StartHelpViewer(const std::vector<std::filesystem::path>& folders,
                      const std::string& commandLine);
 

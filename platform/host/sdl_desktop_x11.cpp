@@ -15,7 +15,7 @@ class XLibrary {
       : m_pDisplay(display), m_pLibrary(SDL_LoadObject("libX11.so.6")) {
     Load(m_pInternAtom, "XInternAtom");
     Load(m_pGetWindowProperty, "XGetWindowProperty");
-    Load(m_pGetGeometry, "XGetGeometry");
+    Load(m_pGetWindowAttributes, "XGetWindowAttributes");
     Load(m_pDefaultRootWindow, "XDefaultRootWindow");
     Load(m_pFree, "XFree");
   }
@@ -24,6 +24,10 @@ class XLibrary {
   XLibrary& operator=(const XLibrary&) = delete;
 
   bool IsComplete() const { return m_bComplete; }
+
+  /// Window managers are told what happens on the root window. One that has gone may have left its
+  /// list of features behind.
+  bool HasWindowManager() const { return (Root().all_event_masks & SubstructureRedirectMask) != 0; }
 
   /// Whether the window manager lists a feature as supported.
   bool DesktopSupports(const char* feature) const {
@@ -46,17 +50,10 @@ class XLibrary {
     return found;
   }
 
-  Size DesktopSize() const {
-    Window root = 0;
-    int x = 0;
-    int y = 0;
-    unsigned width = 0;
-    unsigned height = 0;
-    unsigned border = 0;
-    unsigned depth = 0;
-    m_pGetGeometry(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), &root, &x, &y, &width, &height,
-                   &border, &depth);
-    return {static_cast<int>(width), static_cast<int>(height)};
+  XWindowAttributes Root() const {
+    XWindowAttributes root{};
+    m_pGetWindowAttributes(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), &root);
+    return root;
   }
 
  private:
@@ -73,7 +70,7 @@ class XLibrary {
   bool m_bComplete = true;
   decltype(XInternAtom)* m_pInternAtom = nullptr;
   decltype(XGetWindowProperty)* m_pGetWindowProperty = nullptr;
-  decltype(XGetGeometry)* m_pGetGeometry = nullptr;
+  decltype(XGetWindowAttributes)* m_pGetWindowAttributes = nullptr;
   decltype(XDefaultRootWindow)* m_pDefaultRootWindow = nullptr;
   decltype(XFree)* m_pFree = nullptr;
 };
@@ -93,14 +90,17 @@ bool KnowsFullScreen(SDL_Window* window) {
   Display* display = DisplayOf(window);
   if (display == nullptr) return true;
   const XLibrary library(display);
-  return library.IsComplete() && library.DesktopSupports("_NET_WM_STATE_FULLSCREEN");
+  return library.IsComplete() && library.HasWindowManager() &&
+         library.DesktopSupports("_NET_WM_STATE_FULLSCREEN");
 }
 
 Rect StillThere(SDL_Window* window, const Rect& part) {
   Display* display = DisplayOf(window);
   if (display == nullptr) return part;
   const XLibrary library(display);
-  return library.IsComplete() ? part.Intersection(RectAt({}, library.DesktopSize())) : part;
+  if (!library.IsComplete()) return part;
+  const XWindowAttributes root = library.Root();
+  return part.Intersection(RectAt({}, {root.width, root.height}));
 }
 
 }  // namespace platform

@@ -1,6 +1,7 @@
 #include "platform/host/sdl_window.h"
 
 #include <algorithm>
+#include <string_view>
 
 #include "platform/host/frame_scaling.h"
 #include "platform/host/sdl_desktop.h"
@@ -22,18 +23,20 @@ Size SizeOf(const Rect& rect) { return {rect.Width(), rect.Height()}; }
 
 Rect ToRect(const SDL_Rect& rect) { return RectAt({rect.x, rect.y}, {rect.w, rect.h}); }
 
-/// What windows may cover of each display.
-std::vector<Rect> UsableDisplays() {
+using Bounds = decltype(SDL_GetDisplayBounds);
+
+/// All displays, by what SDL answers of each: all of it, or what panels leave to windows.
+std::vector<Rect> Displays(Bounds* boundsOf) {
   std::vector<Rect> displays;
   for (int i = 0; i < SDL_GetNumVideoDisplays(); ++i) {
     SDL_Rect bounds;
-    if (SDL_GetDisplayUsableBounds(i, &bounds) == 0) displays.push_back(ToRect(bounds));
+    if (boundsOf(i, &bounds) == 0) displays.push_back(ToRect(bounds));
   }
   return displays;
 }
 
 Size ComfortableSize(Size frame) {
-  const std::vector<Rect> displays = UsableDisplays();
+  const std::vector<Rect> displays = Displays(SDL_GetDisplayUsableBounds);
   if (displays.empty()) return frame;
   const auto comfortable = [](int side) {
     return std::max(1, std::min(side * kComfortablePercent / 100, side - 2 * kTitleBar));
@@ -41,6 +44,9 @@ Size ComfortableSize(Size frame) {
   return FittingSize(frame, {comfortable(displays[0].Width()), comfortable(displays[0].Height())},
                      kFirstLeastPercent);
 }
+
+/// Wayland tells no program where its windows stand; what SDL makes up changes by itself.
+bool KnowsPlaces() { return std::string_view(SDL_GetCurrentVideoDriver()) != "wayland"; }
 
 void SetIcon(SDL_Window* window, const CBitmap& icon) {
   std::vector<Pixel> pixels = icon.Pixels();
@@ -80,7 +86,11 @@ bool SdlWindow::Open(bool plain) {
                        SDL_WINDOW_HIDDEN | SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
   if (m_pWindow == nullptr) return false;
   SDL_SetWindowMinimumSize(m_pWindow, m_frameSize.width / 2, m_frameSize.height / 2);
-  return m_canvas.Open(m_pWindow, plain);
+  if (!m_canvas.Open(m_pWindow, plain)) return false;
+  // A sharp display has a larger multiple of its own that may fill a little less.
+  const SDL_Rect picture = WindowRect(RectAt({}, m_frameSize));
+  SDL_SetWindowSize(m_pWindow, picture.w, picture.h);
+  return true;
 }
 
 void SdlWindow::Close() {
@@ -97,7 +107,7 @@ void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitma
 Rect SdlWindow::CurrentRect() const {
   Point at;
   Size size;
-  SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
+  if (KnowsPlaces()) SDL_GetWindowPosition(m_pWindow, &at.x, &at.y);
   SDL_GetWindowSize(m_pWindow, &size.width, &size.height);
   return RectAt(at, size);
 }
@@ -110,10 +120,21 @@ void SdlWindow::PutAt(const Rect& rect) {
   if (at != rect.TopLeft()) SDL_SetWindowPosition(m_pWindow, at.x, at.y);
 }
 
+/// Whoever leaves a window under a panel finds it there again: desktops have one measure for the
+/// panels of all displays. One that must be moved stands clear of them.
+Rect SdlWindow::OnDesktop(const Rect& rect) const {
+  const auto onto = [this, &rect](Bounds* boundsOf) {
+    std::vector<Rect> displays = Displays(boundsOf);
+    for (Rect& display : displays) display = StillThere(m_pWindow, display);
+    return MovedOnto(displays, rect);
+  };
+  return onto(SDL_GetDisplayBounds) == rect ? rect : onto(SDL_GetDisplayUsableBounds);
+}
+
 void SdlWindow::SetPlace(const WindowPlace& place) {
   m_bPlaced = true;
-  PutAt(MovedOnto(UsableDisplays(), place.rect));
-  m_rcAsked = m_rcNormal = CurrentRect();
+  m_rcAsked = OnDesktop(place.rect);
+  PutAt(m_rcAsked);
   m_bOpensMaximized = place.maximized;
 }
 
@@ -138,7 +159,7 @@ void SdlWindow::Appear() {
   SDL_ShowWindow(m_pWindow);
   SDL_PumpEvents();
   m_rcOpened = CurrentRect();
-  const Rect inside = MovedOnto(UsableDisplays(), m_rcOpened);
+  const Rect inside = OnDesktop(m_rcOpened);
   if (inside != m_rcOpened) PutAt(inside);
   m_rcNormal = CurrentRect();
   if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
@@ -176,6 +197,11 @@ bool SdlWindow::IsMaximized() const {
                         : (SDL_GetWindowFlags(m_pWindow) & SDL_WINDOW_MAXIMIZED) != 0;
 }
 
+int SdlWindow::BarHeight() const {
+  const int height = m_rcOpened.top - m_rcAsked.top;
+  return height > 0 && height <= 2 * kTitleBar ? height : 0;
+}
+
 void SdlWindow::ToggleFullScreen() {
   if (IsFullScreen()) {
     LeaveFullScreen();
@@ -196,22 +222,13 @@ void SdlWindow::EnterFullScreen() {
   PutAt(StillThere(m_pWindow, ToRect(display)));
 }
 
-/// The display may have become smaller meanwhile: the window manager says so, or has made the
-/// window smaller with it.
-std::vector<Rect> SdlWindow::RoomBehindFullScreen() const {
-  const Point bar = m_rcOpened.TopLeft() - m_rcAsked.TopLeft();
-  std::vector<Rect> room;
-  for (Rect display : UsableDisplays()) {
-    display = StillThere(m_pWindow, display.Intersection(CurrentRect()));
-    if (bar.y > 0 && bar.y <= kTitleBar * 2) display.top += bar.y;
-    if (!display.IsEmpty()) room.push_back(display);
-  }
-  return room;
-}
-
+/// The display may have become smaller meanwhile.
 void SdlWindow::LeaveFullScreen() {
   const Rect display = CurrentRect();
-  const Rect back = MovedOnto(RoomBehindFullScreen(), m_rcNormal);
+  Rect back = m_rcNormal;
+  back.top -= BarHeight();
+  back = OnDesktop(back);
+  back.top += BarHeight();
   if (!m_bFillsDisplay) SDL_SetWindowFullscreen(m_pWindow, 0);
   m_bFillsDisplay = false;
   if (m_bMaximizedBefore) {

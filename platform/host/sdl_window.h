@@ -50,11 +50,14 @@ class SdlWindow {
   /// Is seen for the first time.
   void Appear();
   Rect CurrentRect() const;
+  /// The nearest place on a display that is there now.
+  Rect OnDesktop(const Rect& rect) const;
+  /// Of the window manager's bar above the window; 0 where none can be told.
+  int BarHeight() const;
   void PutAt(const Rect& rect);
   bool IsFullScreen() const;
   /// In full screen: whether it was before.
   bool IsMaximized() const;
-  std::vector<Rect> RoomBehindFullScreen() const;
   void EnterFullScreen();
   void LeaveFullScreen();
   Size SizeInPixels() const;
