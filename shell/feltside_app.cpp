@@ -3,6 +3,7 @@
 #include <array>
 #include <memory>
 
+#include "platform/dialog/message_box.h"
 #include "platform/window/document_template.h"
 #include "shell/about_dlg.h"
 #include "shell/feltside_doc.h"
@@ -10,6 +11,7 @@
 #include "shell/res/frame_resources.h"
 #include "shell/res/pictures.h"
 #include "shell/window_memory.h"
+#include "table/command_ids.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -55,6 +57,13 @@ int CFeltsideApp::ExitInstance() {
   StoreWindowPlace();
   return CApplication::ExitInstance();
 }
+
+bool CFeltsideApp::CanShowNotice() const {
+  // The deal can be asked for exactly while none is played.
+  return MainFrame()->View().QueryCommand(kCommandDeal) == platform::CommandState::kEnabled;
+}
+
+void CFeltsideApp::ShowNotice(const std::string& trouble) { platform::MessageBox(trouble); }
 
 void CFeltsideApp::OnNew() { OpenNewDocument(); }
 

@@ -26,6 +26,8 @@ class App : public platform::CApplication {
     m_fnAct();
     return false;
   }
+  bool CanShowNotice() const override { return false; }
+  void ShowNotice(const std::string&) override {}
 
  private:
   std::function<void()> m_fnAct;
