@@ -3,6 +3,7 @@
 #include <array>
 #include <memory>
 
+#include "platform/dialog/message_box.h"
 #include "platform/window/document_template.h"
 #include "shell/about_dlg.h"
 #include "shell/feltside_doc.h"
@@ -11,6 +12,7 @@
 #include "shell/res/pictures.h"
 #include "shell/settings.h"
 #include "shell/window_memory.h"
+#include "table/command_ids.h"
 #include "table/feltside_view.h"
 
 namespace feltside {
@@ -61,6 +63,13 @@ const platform::CProfileSection& CFeltsideApp::ReadSettings() {
   m_settings = Profile().Read(kSettingsSection);
   return m_settings;
 }
+
+bool CFeltsideApp::CanShowNotice() const {
+  // The deal can be asked for exactly while none is played.
+  return MainFrame()->View().QueryCommand(kCommandDeal) == platform::CommandState::kEnabled;
+}
+
+void CFeltsideApp::ShowNotice(const std::string& trouble) { platform::MessageBox(trouble); }
 
 void CFeltsideApp::OnNew() { OpenNewDocument(); }
 

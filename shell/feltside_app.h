@@ -35,6 +35,9 @@ class CFeltsideApp : public platform::CApplication {
  protected:
   bool InitInstance() override;
   int ExitInstance() override;
+  /// Between deals only.
+  bool CanShowNotice() const override;
+  void ShowNotice(const std::string& trouble) override;
 
  private:
   struct Commands;

@@ -2,7 +2,7 @@
 
 #include <array>
 
-#include "platform/host/host.h"
+#include "platform/window/application.h"
 #include "shell/res/frame_resources.h"
 #include "table/command_ids.h"
 
@@ -32,9 +32,7 @@ platform::CommandState CMainFrame::QueryCommand(int commandID) const {
 
 void CMainFrame::RunCommand(int commandID) { RunCommandMap(*this, Commands::kMap, commandID); }
 
-void CMainFrame::OnHelp() {
-  platform::TheHost().StartHelpViewer("file:feltside.htm#Main_Contents");
-}
+void CMainFrame::OnHelp() { platform::TheApp().ShowHelp("file:feltside.htm#Main_Contents"); }
 
 bool CMainFrame::OnKeyDown(const platform::KeyStroke& stroke) {
   return m_wndCommandBar.OpenMenuByKey(stroke) || CFrameWindow::OnKeyDown(stroke);

@@ -1,7 +1,7 @@
 #include "shell/setup_dlg.h"
 
 #include "platform/dialog/combo_box.h"
-#include "platform/host/host.h"
+#include "platform/window/application.h"
 #include "shell/res/dialog_templates.h"
 
 namespace feltside {
@@ -27,6 +27,6 @@ void CSetupDlg::OnOK() {
   CDialog::OnOK();
 }
 
-void CSetupDlg::OnHelp() { platform::TheHost().StartHelpViewer("file:cardroom.htm#game_setup"); }
+void CSetupDlg::OnHelp() { platform::TheApp().ShowHelp("file:cardroom.htm#game_setup"); }
 
 }  // namespace feltside

@@ -1,7 +1,6 @@
 #include "shell/setup_table_dlg.h"
 
 #include "platform/dialog/combo_box.h"
-#include "platform/host/host.h"
 #include "platform/window/application.h"
 #include "shell/edit_color_dlg.h"
 #include "shell/res/dialog_templates.h"
@@ -60,8 +59,6 @@ void CSetupTableDlg::OnPaintClient(platform::CSurface& surface) {
   surface.BitBlt(kPreviewAt, kPreviewSize, back);
 }
 
-void CSetupTableDlg::OnHelp() {
-  platform::TheHost().StartHelpViewer("file:cardroom.htm#table_setup");
-}
+void CSetupTableDlg::OnHelp() { platform::TheApp().ShowHelp("file:cardroom.htm#table_setup"); }
 
 }  // namespace feltside

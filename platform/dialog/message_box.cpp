@@ -16,7 +16,15 @@ constexpr int kMargin = 8;
 constexpr int kLineHeight = 8;
 constexpr UnitRect kButton{0, 0, 40, 14};
 
-DialogTemplate FormFor(const std::string& text, MessageBoxButtons buttons) {
+/// A text in which every '&' is only a sign.
+std::string Literally(const std::string& text) {
+  std::string literal;
+  for (const char sign : text) literal.append(sign == '&' ? 2 : 1, sign);
+  return literal;
+}
+
+DialogTemplate FormFor(const std::string& message, MessageBoxButtons buttons) {
+  const std::string text = Literally(message);
   const auto lines = WrapText(text, UnitsAcross(kWidth - 2 * kMargin));
   const int textHeight = static_cast<int>(lines.size()) * kLineHeight;
   const int buttonTop = kMargin + textHeight + kMargin;

@@ -3,12 +3,27 @@
 #include <algorithm>
 
 #include "platform/draw/look.h"
+#include "platform/draw/utf8.h"
 
 namespace platform {
 namespace {
 
 int WidthOf(const std::string& text) {
   return MeasureText(kSystemFont, WithoutMnemonic(text)).width;
+}
+
+/// Breaks the last of some lines, which is one word, until it is no wider than so many pixels.
+void BreakLastWord(std::vector<std::string>& lines, int width) {
+  while (WidthOf(lines.back()) > width) {
+    const std::string word = lines.back();
+    std::size_t end = FittingLength(kSystemFont, word, width);
+    const std::size_t slash = word.substr(0, end).rfind('/');
+    if (slash != std::string::npos && slash > 0) end = slash + 1;
+    end = std::max(end, NextLetter(word, 0));  // where not even one letter fits
+    if (end == word.size()) return;
+    lines.back() = word.substr(0, end);
+    lines.push_back(word.substr(end));
+  }
 }
 
 }  // namespace
@@ -25,6 +40,7 @@ std::vector<std::string> WrapText(const std::string& text, int width) {
     } else {
       lines.back() = longer;
     }
+    BreakLastWord(lines, width);
     from = blank + 1;
   }
   return lines;

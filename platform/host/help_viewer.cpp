@@ -14,14 +14,19 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// The first of the folders that is there; empty where none is.
-fs::path HelpFolder(const std::vector<fs::path>& folders) {
+/// A path that, where it is a relative one, lies beside the program.
+fs::path ProgramPath(const fs::path& path) {
   char* base = SDL_GetBasePath();
   const fs::path program = base == nullptr ? "." : base;
   SDL_free(base);
+  return (program / path).lexically_normal();
+}
+
+/// The first of the folders that is there; empty where none is.
+fs::path HelpFolder(const std::vector<fs::path>& folders) {
   std::error_code error;
   for (const fs::path& folder : folders) {
-    const fs::path place = program / folder;
+    const fs::path place = ProgramPath(folder);
     if (fs::is_directory(place, error)) return fs::canonical(place, error);
   }
   return {};
@@ -84,15 +89,17 @@ fs::path HelpPage(const std::vector<fs::path>& folders, const std::string& comma
   return fs::is_regular_file(folder / page, error) ? folder / page : fs::path{};
 }
 
-bool StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
+std::string StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
   const fs::path page = HelpPage(folders, commandLine);
+  std::string trouble;
   if (page.empty()) {
-    std::cerr << "The help pages are not there.\n";
-    return false;
+    trouble = "The help pages are not in " + ProgramPath(folders.front()).string() + ".";
+  } else if (!OpenDetached(page.string())) {
+    trouble =
+        "There is no xdg-open to show the help with. Open " + page.string() + " in a browser.";
   }
-  if (OpenDetached(page.string())) return true;
-  std::cerr << "There is no xdg-open to show the help with; it lies in " << page << ".\n";
-  return false;
+  if (!trouble.empty()) std::cerr << trouble << '\n';
+  return trouble;
 }
 
 }  // namespace platform

@@ -13,10 +13,10 @@ namespace platform {
 std::filesystem::path HelpPage(const std::vector<std::filesystem::path>& folders,
                                const std::string& commandLine);
 
-/// Shows a help page in the desktop's own browser, as a process that nothing waits for; false where
-/// the page or the program that opens it is not there. Whether a browser then comes up is not
-/// known.
-bool StartHelpViewer(const std::vector<std::filesystem::path>& folders,
-                     const std::string& commandLine);
+/// Shows a help page in the desktop's own browser, as a process that nothing waits for. Where the
+/// page or the program that opens it is not there, returns that in a sentence, and says it on the
+/// error stream; whether a browser then comes up is not known.
+std::string StartHelpViewer(const std::vector<std::filesystem::path>& folders,
+                            const std::string& commandLine);
 
 }  // namespace platform

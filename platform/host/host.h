@@ -48,8 +48,9 @@ class Host {
   virtual void SetClipboard(const std::string& text) = 0;
 
   /// Starts the help viewer with a command line such as "file:page.htm#topic", beside the program.
-  /// False where it is known not to have come up, as the page or a viewer is missing.
-  virtual bool StartHelpViewer(const std::string& commandLine) = 0;
+  /// Returns what is known to have kept it from coming up, in a sentence for the person that names
+  /// the page's place; empty where nothing is known to.
+  virtual std::string StartHelpViewer(const std::string& commandLine) = 0;
   /// The folder that keeps programs' settings; it need not exist yet. Empty where the machine has
   /// none.
   virtual std::filesystem::path ProfileFolder() = 0;

@@ -26,8 +26,8 @@ class OffscreenHost : public Host {
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
   /// Where text is wanted; nothing where none is.
   const std::optional<Rect>& TextPlace() const { return m_rcText; }
-  /// Whether help viewers come up from now on.
-  void SetHelpViewer(bool there) { m_bHelpViewer = there; }
+  /// What keeps help viewers from coming up from now on.
+  void SetHelpTrouble(const std::string& trouble) { m_strHelpTrouble = trouble; }
 
   void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
@@ -40,9 +40,9 @@ class OffscreenHost : public Host {
   void SetTextInput(const std::optional<Rect>& place) override { m_rcText = place; }
   std::string GetClipboard() override { return m_strClipboard; }
   void SetClipboard(const std::string& text) override { m_strClipboard = text; }
-  bool StartHelpViewer(const std::string& commandLine) override {
+  std::string StartHelpViewer(const std::string& commandLine) override {
     m_arrHelpCalls.push_back(commandLine);
-    return m_bHelpViewer;
+    return m_strHelpTrouble;
   }
   std::filesystem::path ProfileFolder() override { return m_profileFolder; }
 
@@ -56,7 +56,7 @@ class OffscreenHost : public Host {
   CBitmap m_shown;
   std::string m_strClipboard;
   std::vector<std::string> m_arrHelpCalls;
-  bool m_bHelpViewer = true;
+  std::string m_strHelpTrouble;
   std::optional<Rect> m_rcText;
   std::optional<WindowPlace> m_windowPlace;
 };

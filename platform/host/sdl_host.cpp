@@ -71,7 +71,7 @@ class SdlHost : public Host {
   std::string GetClipboard() override { return TakeText(SDL_GetClipboardText()); }
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
-  bool StartHelpViewer(const std::string& commandLine) override {
+  std::string StartHelpViewer(const std::string& commandLine) override {
     return platform::StartHelpViewer(m_arrHelpFolders, commandLine);
   }
 

@@ -1,5 +1,6 @@
 #include "platform/window/application.h"
 
+#include <algorithm>
 #include <cstdlib>
 #include <utility>
 
@@ -32,7 +33,10 @@ CApplication::~CApplication() {
 int CApplication::Main() {
   if (!InitInstance()) return EXIT_FAILURE;
   RunUntil([] { return false; });
-  return ExitInstance();
+  const int exitCode = ExitInstance();
+  m_bQuit = false;  // the boxes of the last notices run
+  while (HasNotice()) ShowNextNotice();
+  return exitCode;
 }
 
 void CApplication::RunUntil(const std::function<bool()>& done) {
@@ -40,7 +44,7 @@ void CApplication::RunUntil(const std::function<bool()>& done) {
   while (!m_bQuit && !done()) {
     if (!m_queue.Peek(message)) {
       OnIdle();
-      m_queue.Wait(m_screen.TimeToTip());
+      if (!m_bQuit) m_queue.Wait(m_screen.TimeToTip());
     } else if (message.kind == MessageKind::kQuit) {
       m_bQuit = true;
       m_nExitCode = message.exitCode;
@@ -67,6 +71,31 @@ void CApplication::Dispatch(const Message& message) {
 }
 
 void CApplication::OnIdle() {
+  Refresh();
+  while (HasNotice() && !m_bQuit && !m_bShowingNotice && CanShowNotice()) {
+    ShowNextNotice();
+    Refresh();
+  }
+}
+
+void CApplication::ShowNextNotice() {
+  m_bShowingNotice = true;
+  ShowNotice(m_arrNotices[m_nShownNotices++]);
+  m_bShowingNotice = false;
+}
+
+void CApplication::Notify(const std::string& trouble) {
+  if (std::find(m_arrNotices.begin(), m_arrNotices.end(), trouble) == m_arrNotices.end()) {
+    m_arrNotices.push_back(trouble);
+  }
+}
+
+void CApplication::ShowHelp(const std::string& commandLine) {
+  const std::string trouble = TheHost().StartHelpViewer(commandLine);
+  if (!trouble.empty()) Notify(trouble);
+}
+
+void CApplication::Refresh() {
   if (m_pMainFrame != nullptr) m_pMainFrame->RefreshCommandStates();
   m_screen.PaintAll();
   m_screen.Present();
@@ -88,7 +117,7 @@ void CApplication::ShowMainWindow(int iconID) {
   TheHost().SetIdentity(m_pMainFrame->GetTitle(),
                         m_resources.LoadIconOfSize(iconID, kWindowIconWidth));
   m_pMainFrame->Open();
-  OnIdle();
+  Refresh();
 }
 
 bool CApplication::OpenNewDocument() { return m_pDocTemplate->OpenNewDocument(); }

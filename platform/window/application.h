@@ -3,6 +3,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "platform/draw/resources.h"
 #include "platform/store/profile.h"
@@ -38,6 +39,12 @@ class CApplication : public CCommandTarget {
   CProfile& Profile() const { return *m_pProfile; }
   CFrameWindow* MainFrame() const { return m_pMainFrame; }
 
+  /// Has trouble told to the person, in a sentence, once in a run: when the program lies idle and
+  /// can be interrupted, at the latest when it ends. The error stream is the caller's.
+  void Notify(const std::string& trouble);
+  /// Opens the help viewer; trouble with it is notified.
+  void ShowHelp(const std::string& commandLine);
+
   /// Handles one message. kQuit is not for here.
   void Dispatch(const Message& message);
   /// Runs messages until the condition holds or the program is to end.
@@ -48,6 +55,11 @@ class CApplication : public CCommandTarget {
   virtual bool InitInstance() = 0;
   /// What is to be done at the end; returns the exit code.
   virtual int ExitInstance() { return m_nExitCode; }
+
+  /// Whether what the person does may be interrupted by a notice now.
+  virtual bool CanShowNotice() const = 0;
+  /// Shows a notice and returns when it was read.
+  virtual void ShowNotice(const std::string& trouble) = 0;
 
   /// Names the maker under whose folder the settings lie.
   void SetRegistryKey(const std::string& key);
@@ -60,6 +72,9 @@ class CApplication : public CCommandTarget {
 
  private:
   void OnIdle();
+  void Refresh();
+  bool HasNotice() const { return m_nShownNotices < m_arrNotices.size(); }
+  void ShowNextNotice();
 
   std::string m_strName;
   CResources m_resources;
@@ -68,6 +83,9 @@ class CApplication : public CCommandTarget {
   std::unique_ptr<CProfile> m_pProfile;
   std::unique_ptr<CSingleDocTemplate> m_pDocTemplate;
   CFrameWindow* m_pMainFrame = nullptr;
+  std::vector<std::string> m_arrNotices;  ///< of the whole run
+  std::size_t m_nShownNotices = 0;        ///< the first so many of them
+  bool m_bShowingNotice = false;
   bool m_bQuit = false;
   int m_nExitCode = 0;
 };

@@ -4,6 +4,8 @@
 
 #include "platform/dialog/combo_box.h"
 #include "platform/dialog/message_box.h"
+#include "platform/draw/look.h"
+#include "platform/draw/wrapped_text.h"
 #include "platform/window/application.h"
 #include "tests/support/desk.h"
 #include "tests/support/script.h"
@@ -26,6 +28,8 @@ class App : public platform::CApplication {
     m_fnAct();
     return false;
   }
+  bool CanShowNotice() const override { return false; }
+  void ShowNotice(const std::string&) override {}
 
  private:
   std::function<void()> m_fnAct;
@@ -91,6 +95,24 @@ TEST(Menu, KnowsAnItemByItsMarkedLetterElseByItsFirst) {
   for (const auto& [text, letter] : std::vector<std::pair<std::string, char>>{
            {"E&xit", 'X'}, {"Help...", 'H'}, {"help", 'H'}, {"7 up", '7'}, {"", 0}}) {
     EXPECT_EQ(platform::LetterOf(text), letter) << text;
+  }
+}
+
+TEST(WrapText, BreaksWhatIsWiderThanTheLineBehindASlashOrALetter) {
+  struct Case {
+    std::string text;
+    std::string widest;  ///< what just fits a line
+    std::vector<std::string> lines;
+  };
+  for (const Case& c :
+       {Case{"in one line", "in one line", {"in one line"}},
+        {"two words that do not fit", "do not fit", {"two", "words", "that do", "not fit"}},
+        {"See /home/of/a/long.name", "/home/of/", {"See", "/home/of/", "a/", "long.nam", "e"}},
+        {"mmmmmmm no", "mmmm", {"mmmm", "mmm", "no"}},
+        {"/ab", "/", {"/", "a", "b"}},
+        {"", "", {""}}}) {
+    EXPECT_EQ(platform::WrapText(c.text, MeasureText(platform::kSystemFont, c.widest).width),
+              c.lines);
   }
 }
 
