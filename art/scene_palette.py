@@ -18,8 +18,8 @@ def _ramp(name, count, *stops):
 
 
 SCENE_PALETTE = {
-    # Stands for "no pixel" where a picture is transparent. The dark of the felt's rim: where a desktop
-    # scales an icon smoothly, a trace of it may show.
+    # Stands for "no pixel" where a picture is transparent. The dark of the felt's rim: where a
+    # desktop scales an icon smoothly, a trace of it may show.
     "nothing": (0x04, 0x30, 0x1A),
     # The one grey of everything that can be pressed; its edges are white, grey_80 and grey_40.
     "button_face": (0xD4, 0xD0, 0xC8),

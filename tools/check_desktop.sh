@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Checks what the game brings to a desktop: its entry, its description, its manual pages, and that an
-# icon is there for each. Needs desktop-file-utils, appstream and mandoc.
+# Checks what the game brings to a desktop: its entry, its description, its manual pages, and that its
+# icon is there in each size. Needs desktop-file-utils, appstream and mandoc.
 set -u
 cd "$(dirname "$(readlink -f "$0")")/../editions/desktop" || exit 1
 faults=0
@@ -22,4 +22,10 @@ said=$(mandoc -T lint ./*.6 2>&1 | grep -v 'referenced manual not found: Xr felt
   echo "$said"
   faults=1
 }
+for size in 16 22 24 32 48 64 128 256; do
+  [ -f icons/feltside_$size.png ] || {
+    echo "There is no icon of $size pixels."
+    faults=1
+  }
+done
 exit $faults

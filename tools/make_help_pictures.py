@@ -3,8 +3,8 @@
 
     tools/make_help_pictures.py [STYLUS]
 
-plays the scenes of scenes.txt with the stylus program (default: the one that ./play builds) and writes them
-into help/pictures, twice their size. Needs Pillow (Debian: python3-pil).
+plays the scenes of scenes.txt with the stylus program (default: the one that ./play builds) and
+writes them into help/pictures, twice their size. Needs Pillow (Debian: python3-pil).
 """
 
 import sys

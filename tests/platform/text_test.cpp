@@ -8,31 +8,14 @@
 #include <algorithm>
 #include <cstdlib>
 #include <fstream>
-#include <new>
 #include <random>
 #include <set>
 
 #include "platform/draw/look.h"
 #include "platform/draw/utf8.h"
 #include "platform/draw/wrapped_text.h"
+#include "tests/platform/failing_machine.h"
 #include "tests/support/golden.h"
-
-namespace {
-
-/// How often memory can still be had before it is refused, once or from then on; below 0: always.
-int s_nUntilRefused = -1;
-bool s_bRefusedForGood = false;
-
-}  // namespace
-
-void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
-  if (s_nUntilRefused == 0) {
-    if (!s_bRefusedForGood) s_nUntilRefused = -1;
-    return nullptr;
-  }
-  if (s_nUntilRefused > 0) --s_nUntilRefused;
-  return ::operator new(size);
-}
 
 namespace feltside::tests {
 namespace {
@@ -52,12 +35,12 @@ std::vector<Font> AllFonts() {
 // The first of this program to draw texts of these fonts, which the game does not use.
 TEST(Text, IsWholeAgainAfterMemoryWasShort) {
   for (const Font& font : {Font{15, false}, Font{22, true}}) {
-    s_bRefusedForGood = font.bold;
+    g_bRefusesOnce = font.bold;
     int tries = 0;
     for (bool refused = true; refused && tries < 1000; ++tries) {
-      s_nUntilRefused = tries;
+      g_nBeforeRefusal = tries;
       EXPECT_EQ(RenderText(font, "V").GetSize().height, font.height);
-      refused = std::exchange(s_nUntilRefused, -1) <= 0;
+      refused = std::exchange(g_nBeforeRefusal, -1) <= 0;
     }
     EXPECT_GT(tries, 65);  // in so many pieces a face and a glyph are read
   }
@@ -125,10 +108,11 @@ bool Touch(const std::vector<Point>& first, const std::vector<Point>& second) {
 TEST(Text, KeepsTheLettersOfTheGameApart) {
   // No column is clear between these, but nothing touches:
   const std::string overhangs =
-      "Ta Tr Tw Ty Ve Wa Ye Yo "   // an arm reaches over a small letter
-      "at av ay "                  // a tail runs out below a letter that stands free there
-      "kj kJ "                     // a leg runs out above a hook
-      "-1 -2 -3 -7 14 17 41 47 ";  // there is room beside a stroke, a foot, a slope
+      "Ta Tr Tw Ty Ve Wa Ye Yo "  // an arm reaches over a small letter
+      "at av ay "                 // a tail runs out below a letter that stands free there
+      "kj kJ "                    // a leg runs out above a hook
+      "-1 -2 -3 -7 14 17 41 47 "  // there is room beside a stroke, a foot, a slope
+      "-v -) +) r) ";             // or before a bow
   const std::set<std::string> texts = TextsOfTheGame();
   EXPECT_GT(texts.size(), 250U);
   const std::vector<Font> used = {{11}, {11, true}, {13}, {13, true}, {14, true}, {15, true}, {22}};
