@@ -1,6 +1,7 @@
 #include "platform/host/sdl_window.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <string_view>
 
 #include "platform/host/frame_scaling.h"
