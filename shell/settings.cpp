@@ -35,26 +35,26 @@ struct CFeltsideView::Settings {
     void (*set)(View&, int);
   };
 
-  /// A setting that a member holds; in the layout, that is a path of two.
+  // Of a member, or of one of a member: view.*a.*b.
+  template <auto... Path>
+  static int Get(const View& view) {
+    return static_cast<int>((view.*....*Path));
+  }
+  template <auto... Path>
+  static void Set(View& view, int value) {
+    auto& member = (view.*....*Path);
+    member = static_cast<std::remove_reference_t<decltype(member)>>(value);
+  }
   template <auto... Path>
   static constexpr Setting Of(const char* name, int lowest, int highest, int absent) {
-    return {name,
-            lowest,
-            highest,
-            absent,
-            [](const View& view) { return static_cast<int>((view.*....*Path)); },
-            [](View& view, int value) {
-              auto& member = (view.*....*Path);
-              member = static_cast<std::remove_reference_t<decltype(member)>>(value);
-            }};
+    return {name, lowest, highest, absent, &Get<Path...>, &Set<Path...>};
   }
 
-  static int GameType(const View& view) { return view.m_nGameType; }
   /// A hand that is being played is played out in its own game.
   static void SetGameType(View& view, int gameType) {
     if (view.m_bHandInProgress == 0) view.m_nGameType = gameType;
   }
-  static int PlaySpeed(const View& view) { return view.PlaySpeed(); }
+  static int GetPlaySpeed(const View& view) { return view.PlaySpeed(); }
   static void SetPlaySpeed(View& view, int speed) { view.SetPlaySpeed(speed); }
 
   static const std::array<Setting, 11> kAll;
@@ -62,7 +62,8 @@ struct CFeltsideView::Settings {
 
 /// In the order in which they are read.
 constexpr std::array<CFeltsideView::Settings::Setting, 11> CFeltsideView::Settings::kAll = {{
-    {"GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack, &GameType, &SetGameType},
+    {"GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack, &Get<&View::m_nGameType>,
+     &SetGameType},
     Of<&View::m_bUseHighScores>("USEHIGH", 0, 1, 1),
     Of<&View::m_bFancyPoker>("FANCYVP", 0, 1, 1),
     Of<&View::m_bFancyBlackjack>("FANCYBJ", 0, 1, 1),
@@ -73,7 +74,7 @@ constexpr std::array<CFeltsideView::Settings::Setting, 11> CFeltsideView::Settin
     Of<&View::m_nMaxDiscards>("VIDEODISCARDS", 0, kPokerCards, 3),
     Of<&View::m_nStrategyMode>("STRATTYPE", kStrategyNone, kStrategyAlways, kStrategyButton),
     Of<&View::m_nDeckChoice>("NUMDECKS", 0, 2, 1),
-    {"PLAYSPEED", kLeast, kMost, 1, &PlaySpeed, &SetPlaySpeed},
+    {"PLAYSPEED", kLeast, kMost, 1, &GetPlaySpeed, &SetPlaySpeed},
 }};
 
 void CFeltsideView::LoadSettings() {

@@ -44,9 +44,8 @@ class CProfileSection {
 /// The store of the player's choices: integers and strings by section and entry, which two running
 /// games may share. Every call reads it anew.
 ///
-/// Nothing of it throws and nothing ends the program: what cannot be read counts as absent, what
-/// cannot be stored leaves the store as it was, and a sentence says so on the error stream and to
-/// whoever takes the troubles.
+/// What cannot be read counts as absent, what cannot be stored leaves the store as it was, and the
+/// program goes on; a sentence says so on the error stream and to whoever takes the troubles.
 class CProfile {
  public:
   CProfile() = default;

@@ -72,6 +72,9 @@ void CApplication::Dispatch(const Message& message) {
 
 void CApplication::OnIdle() {
   Refresh();
+  if (m_pProfile != nullptr) {
+    for (const std::string& trouble : m_pProfile->TakeTroubles()) Notify(trouble);
+  }
   while (HasNotice() && !m_bQuit && !m_bShowingNotice && CanShowNotice()) {
     ShowNextNotice();
     Refresh();

@@ -112,14 +112,13 @@ TEST_F(ProfileTest, SetsADamagedFileAside) {
 }
 
 TEST_F(ProfileTest, ReadsLettersWhereTheyHaveTheirPlace) {
-  for (const std::string text :
-       {"\xEF\xBB\xBF# \xC3\xA9 'no string\n", "a = \"\xC3\xA9 \\\" \xC3\xA9\" # \xC3\xA9 \"\n",
-        "'\xC3\xA9'.\"\xC3\xA9\" = '\xC3\xA9 \\'\n",
-        "a = \"\"\"\"\"\xC3\xA9\\\n b \\\"\"\"\"\"\"\n", "a = '''\n'\xC3\xA9'\n'''''\n",
-        "[\"\xC3\xA9\"]\n", "[a.'\xC3\xA9']\n[[b.'\xC3\xA9']]\n",
-        "a = [1.5,\n['\xC3\xA9'], {'\xC3\xA9' = 1, b = '\xC3\xA9'}, # \xC3\xA9\n\"\"]\n",
-        "a = [1.1, 1.2, 1.3, 1.4, 1.5, 1.6, 1.7, 1.8, 1.9, 1.1, 1.2, 1.3, 1.4, 1.5, 1.6, 1.7, 1.8,"
-        "1.9, 1.1, 1.2, 1.3, 1.4, 1.5, 1.6, 1.7, 1.8, 1.9, 1.1, 1.2, 1.3, 1.4, 1.5, 1.6, 1.7]\n"}) {
+  for (const std::string& text : std::vector<std::string>{
+           "\xEF\xBB\xBF# \xC3\xA9 'no string\n", "a = \"\xC3\xA9 \\\" \xC3\xA9\" # \xC3\xA9 \"\n",
+           "'\xC3\xA9'.\"\xC3\xA9\" = '\xC3\xA9 \\'\n",
+           "a = \"\"\"\"\"\xC3\xA9\\\n b \\\"\"\"\"\"\"\n", "a = '''\n'\xC3\xA9'\n'''''\n",
+           "[\"\xC3\xA9\"]\n", "[a.'\xC3\xA9']\n[[b.'\xC3\xA9']]\n",
+           "a = [1.5,\n['\xC3\xA9'], {'\xC3\xA9' = 1, b = '\xC3\xA9'}, # \xC3\xA9\n\"\"]\n",
+           "a = [" + Repeated("1.5, ", 99) + "]\n"}) {
     WriteFile(m_file, text + "[S]\nx = 5\n");
     EXPECT_EQ(GetInt("x"), 5) << text;
   }

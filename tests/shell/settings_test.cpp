@@ -59,7 +59,8 @@ TEST(Settings, AreStoredEachAsItsOwn) {
   for (const Setting& setting : kSettings) {
     const int value = setting.highest != setting.absent ? setting.highest : setting.lowest;
     Stylus stylus("[Settings]\n" + setting.name + " = " + std::to_string(value));
-    for (const char* command : {"command 32779", "press 1", "command 32777", "press 1"}) {
+    for (const char* command :
+         {"command game-setup", "press 1", "command table-setup", "press 1"}) {
       stylus.Send(command);
     }
     std::string stored = "[Settings]\n";
