@@ -74,6 +74,7 @@ class CApplication : public CCommandTarget {
   void OnIdle();
   void Refresh();
   bool HasNotice() const { return m_nShownNotices < m_arrNotices.size(); }
+  void TakeTroubles();
   void ShowNextNotice();
 
   std::string m_strName;
