@@ -30,6 +30,7 @@ TEST(CommandLine, IsAnsweredOrRefused) {
     std::vector<std::string> words = {"feltside"};
     words.insert(words.end(), c.words.begin(), c.words.end());
     std::vector<char*> argv;
+    argv.reserve(words.size());
     for (std::string& word : words) argv.push_back(word.data());
     testing::internal::CaptureStdout();
     testing::internal::CaptureStderr();
