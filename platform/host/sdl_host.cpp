@@ -72,9 +72,8 @@ class SdlHost : public Host {
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
   std::string StartHelpViewer(const std::string& commandLine) override {
-    // Long enough for an opener to find no browser, and too short to be felt beside a browser's
-    // start.
-    constexpr int kPatience = 500;
+    // Long enough for an opener to find no browser, and short beside a browser's start.
+    constexpr int kPatience = 1000;
     return platform::StartHelpViewer(m_arrHelpFolders, commandLine, kPatience);
   }
 

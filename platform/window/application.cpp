@@ -98,6 +98,7 @@ void CApplication::Notify(const std::string& trouble) {
 }
 
 void CApplication::ShowHelp(const std::string& commandLine) {
+  Refresh();  // the start may take a moment, in which no closed menu is to stay in sight
   const std::string trouble = TheHost().StartHelpViewer(commandLine);
   if (!trouble.empty()) Notify(trouble);
 }
