@@ -21,9 +21,10 @@ class CComboBox : public CControl {
   /// The place of the choice; -1 for none.
   int GetValue() const override { return m_nChoice; }
   int GetItemCount() const { return static_cast<int>(m_arrItems.size()); }
-  /// Shows an item as chosen; a place outside the list leaves no choice.
+  /// Shows an item as chosen; a place outside the list leaves no choice. The dialog is not told.
   void SetCurSel(int item);
-  /// Chooses an item as the person does: the dialog is told when the choice changed.
+  /// Chooses an item as the person does: the dialog is told when the choice changed. Nothing for a
+  /// place behind the last item.
   void Choose(int item);
   /// Drops the list.
   void Activate() override;

@@ -14,8 +14,10 @@ class CDialog;
 /// is done to it.
 class CControl : public CWindow {
  public:
+  /// The place is in pixels of the dialog's window, which outlives the control.
   CControl(CDialog& dialog, const ControlTemplate& control, const Rect& place);
 
+  /// Not unique among controls that nobody asks for.
   int GetID() const { return m_nID; }
   const std::string& GetText() const { return m_strText; }
   virtual void SetText(const std::string& text);

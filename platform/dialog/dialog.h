@@ -21,12 +21,14 @@ inline constexpr int kResultCancel = 2;
 /// marked letter (with Alt, or alone where no text is typed) activates it, F1 asks for help.
 class CDialog : public CTopWindow {
  public:
+  /// Makes the controls and places the dialog in the middle of the screen, not yet open.
   explicit CDialog(const DialogTemplate& form);
   ~CDialog() override;
 
   /// Runs the dialog and returns how it was ended. When the program is to end meanwhile, it is
   /// cancelled.
   int DoModal();
+  /// Has DoModal return this result once the handler that calls it is over.
   void EndDialog(int result);
 
   const std::vector<std::unique_ptr<CControl>>& Controls() const { return m_arrControls; }
@@ -39,10 +41,10 @@ class CDialog : public CTopWindow {
   }
   /// Gives the keyboard to the tab stop that follows a control.
   void FocusAfter(const CControl& control);
-  /// What a push button of that number does.
+  /// What a push button of that number does: OK and Cancel by their handlers, others by OnButton.
   void Push(int controlID);
 
-  // What a dialog may answer to.
+  // What a dialog may answer to. A number is that of the control.
 
   /// The controls are made; the derived dialog fills them. True: the keyboard goes to the first tab
   /// stop.

@@ -16,8 +16,11 @@ class CSlider : public CControl {
   int GetValue() const override { return m_nPos; }
   int GetLowest() const { return m_nLowest; }
   int GetHighest() const { return m_nHighest; }
+  /// The position stays; it is for SetPos to bring it into the range.
   void SetRange(int lowest, int highest);
+  /// How far an arrow key or a notch, and a press beside the thumb, move it.
   void SetSteps(int line, int page);
+  /// The nearest position within the range. The dialog is not told.
   void SetPos(int pos);
   /// Moves as the person does: within the range, and the dialog is told.
   void MoveTo(int pos);

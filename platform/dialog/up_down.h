@@ -12,6 +12,7 @@ class CUpDown : public CControl {
 
   const char* KindName() const override { return "updown"; }
   int GetValue() const override { return m_nPos; }
+  /// The control must outlive this one; null: none.
   void SetBuddy(CControl* buddy) { m_pBuddy = buddy; }
   void SetRange(int lowest, int highest);
   /// A position outside the range becomes the nearest bound.

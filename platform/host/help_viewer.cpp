@@ -2,6 +2,7 @@
 
 #include <SDL_filesystem.h>
 #include <fcntl.h>
+#include <poll.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -32,15 +33,20 @@ fs::path HelpFolder(const std::vector<fs::path>& folders) {
   return {};
 }
 
-/// Becomes the opener, with nothing of it reaching the program's streams; where it cannot, says so
-/// through the pipe, which closes when it can.
+/// Where the opener tells that it failed; a number that every shell can redirect.
+constexpr int kFailureStream = 3;
+
+/// Becomes the opener, with nothing of it reaching the program's streams. When it fails, something
+/// is written into the pipe; in any case that is closed when it ends.
 [[noreturn]] void BecomeOpener(const std::string& address, int pipe) {
   const int nowhere = open("/dev/null", O_RDWR | O_CLOEXEC);
-  for (int stream = 0; stream <= 2; ++stream) dup2(nowhere, stream);
-  execlp("xdg-open", "xdg-open", address.c_str(), nullptr);
-  const char failed = 1;
-  if (write(pipe, &failed, 1) == 1) _exit(127);
-  _exit(126);
+  for (int stream = 0; stream < kFailureStream; ++stream) dup2(nowhere, stream);
+  const int failure = fcntl(pipe, F_DUPFD, kFailureStream + 1);
+  dup2(failure, kFailureStream);
+  close(failure);
+  execl("/bin/sh", "sh", "-c", "xdg-open \"$1\" 3>&- || echo failed >&3", "sh", address.c_str(),
+        nullptr);
+  _exit(127);
 }
 
 /// Calls a system function again for as long as only a signal keeps it from its work.
@@ -51,9 +57,9 @@ auto Insist(const Call& call) {
   return result;
 }
 
-/// Runs the opener as a grandchild, so that it is nobody's to wait for when it ends. Answers
-/// whether there is one; that it has started is known at once.
-bool OpenDetached(const std::string& address) {
+/// Runs the opener as a grandchild, so that it is nobody's to wait for when it ends. False where it
+/// could not be started, or has failed within so many milliseconds.
+bool OpenDetached(const std::string& address, int milliseconds) {
   int ends[2];
   if (pipe2(ends, O_CLOEXEC) != 0) return false;
   const pid_t child = fork();
@@ -64,10 +70,12 @@ bool OpenDetached(const std::string& address) {
   }
   close(ends[1]);
   if (child > 0) Insist([child] { return waitpid(child, nullptr, 0); });
-  char failed = 0;
-  const bool started = child > 0 && Insist([&] { return read(ends[0], &failed, 1); }) == 0;
+  pollfd failure{ends[0], POLLIN, 0};
+  const bool ended = Insist([&] { return poll(&failure, 1, milliseconds); }) > 0;
+  char sign = 0;
+  const bool failed = ended && Insist([&] { return read(ends[0], &sign, 1); }) != 0;
   close(ends[0]);
-  return started;
+  return child > 0 && !failed;
 }
 
 }  // namespace
@@ -89,14 +97,14 @@ fs::path HelpPage(const std::vector<fs::path>& folders, const std::string& comma
   return fs::is_regular_file(folder / page, error) ? folder / page : fs::path{};
 }
 
-std::string StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine) {
+std::string StartHelpViewer(const std::vector<fs::path>& folders, const std::string& commandLine,
+                            int milliseconds) {
   const fs::path page = HelpPage(folders, commandLine);
   std::string trouble;
   if (page.empty()) {
     trouble = "The help pages are not in " + ProgramPath(folders.front()).string() + ".";
-  } else if (!OpenDetached(page.string())) {
-    trouble =
-        "There is no xdg-open to show the help with. Open " + page.string() + " in a browser.";
+  } else if (!OpenDetached(page.string(), milliseconds)) {
+    trouble = "The help cannot be shown in a browser; it lies in " + page.string() + ".";
   }
   if (!trouble.empty()) std::cerr << trouble << '\n';
   return trouble;

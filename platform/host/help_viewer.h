@@ -14,9 +14,9 @@ std::filesystem::path HelpPage(const std::vector<std::filesystem::path>& folders
                                const std::string& commandLine);
 
 /// Shows a help page in the desktop's own browser, as a process that nothing waits for. Where the
-/// page or the program that opens it is not there, returns that in a sentence, and says it on the
-/// error stream; whether a browser then comes up is not known.
+/// page or the program that opens it is not there, or that has failed within so many milliseconds,
+/// returns that in a sentence, and says it on the error stream. Later failures are not known.
 std::string StartHelpViewer(const std::vector<std::filesystem::path>& folders,
-                            const std::string& commandLine);
+                            const std::string& commandLine, int milliseconds);
 
 }  // namespace platform

@@ -72,7 +72,9 @@ class SdlHost : public Host {
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
   std::string StartHelpViewer(const std::string& commandLine) override {
-    return platform::StartHelpViewer(m_arrHelpFolders, commandLine);
+    // Long enough for an opener to find no browser, and short beside a browser's start.
+    constexpr int kPatience = 1000;
+    return platform::StartHelpViewer(m_arrHelpFolders, commandLine, kPatience);
   }
 
   std::filesystem::path ProfileFolder() override { return DefaultProfileFolder(); }

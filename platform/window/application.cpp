@@ -34,6 +34,7 @@ int CApplication::Main() {
   if (!InitInstance()) return EXIT_FAILURE;
   RunUntil([] { return false; });
   const int exitCode = ExitInstance();
+  TakeTroubles();
   m_bQuit = false;  // the boxes of the last notices run
   while (HasNotice()) ShowNextNotice();
   return exitCode;
@@ -72,13 +73,16 @@ void CApplication::Dispatch(const Message& message) {
 
 void CApplication::OnIdle() {
   Refresh();
-  if (m_pProfile != nullptr) {
-    for (const std::string& trouble : m_pProfile->TakeTroubles()) Notify(trouble);
-  }
+  TakeTroubles();
   while (HasNotice() && !m_bQuit && !m_bShowingNotice && CanShowNotice()) {
     ShowNextNotice();
     Refresh();
   }
+}
+
+void CApplication::TakeTroubles() {
+  if (m_pProfile == nullptr) return;
+  for (const std::string& trouble : m_pProfile->TakeTroubles()) Notify(trouble);
 }
 
 void CApplication::ShowNextNotice() {
@@ -94,6 +98,7 @@ void CApplication::Notify(const std::string& trouble) {
 }
 
 void CApplication::ShowHelp(const std::string& commandLine) {
+  Refresh();  // the start may take a moment, in which no closed menu is to stay in sight
   const std::string trouble = TheHost().StartHelpViewer(commandLine);
   if (!trouble.empty()) Notify(trouble);
 }

@@ -27,7 +27,7 @@ class CApplication : public CCommandTarget {
   CApplication(const CApplication&) = delete;
   CApplication& operator=(const CApplication&) = delete;
 
-  /// Starts the program, runs it to its end and returns the exit code.
+  /// Starts the program, runs it to its end and returns the exit code. Once only.
   int Main();
 
   /// Also the title of message boxes and the name of the settings' file.
@@ -37,6 +37,7 @@ class CApplication : public CCommandTarget {
   CResources& Resources() { return m_resources; }
   /// Where the player's choices are kept; SetRegistryKey comes first.
   CProfile& Profile() const { return *m_pProfile; }
+  /// Null until the main window is shown.
   CFrameWindow* MainFrame() const { return m_pMainFrame; }
 
   /// Has trouble told to the person, in a sentence, once in a run: when the program lies idle and
@@ -47,7 +48,8 @@ class CApplication : public CCommandTarget {
 
   /// Handles one message. kQuit is not for here.
   void Dispatch(const Message& message);
-  /// Runs messages until the condition holds or the program is to end.
+  /// Runs messages until the condition holds or the program is to end. May be nested: each modal
+  /// dialog has a loop of its own.
   void RunUntil(const std::function<bool()>& done);
 
  protected:
@@ -74,6 +76,7 @@ class CApplication : public CCommandTarget {
   void OnIdle();
   void Refresh();
   bool HasNotice() const { return m_nShownNotices < m_arrNotices.size(); }
+  void TakeTroubles();
   void ShowNextNotice();
 
   std::string m_strName;

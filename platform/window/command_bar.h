@@ -27,6 +27,8 @@ class CCommandBar : public CWindow {
  public:
   CCommandBar(CWindow* frame, const Rect& place);
 
+  // Each once, in this order: the tool bar stands behind the menu's title.
+
   void InsertMenuBar(const MenuTemplate& menu);
   /// Adds the close button.
   void AddAdornments();

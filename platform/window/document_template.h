@@ -35,6 +35,7 @@ class CSingleDocTemplate {
   /// not be made.
   bool OpenNewDocument();
 
+  /// Null before the first document.
   CFrameWindow* Frame() const { return m_pFrame.get(); }
 
  private:

@@ -31,7 +31,9 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
   /// Builds the frame's own parts; 0, or -1 to give the frame up.
   virtual int OnCreate() { return 0; }
 
+  /// Takes the view, once, and gives it the keyboard.
   void SetView(std::unique_ptr<CView> view);
+  /// There must be one.
   CView& View() const { return *m_pView; }
   /// Where the view stands in the frame.
   Rect ViewPlace() const;

@@ -10,7 +10,7 @@ namespace platform {
 
 /// A line of a menu; command 0 is a separator.
 struct MenuItem {
-  std::string text;
+  std::string text;  ///< '&' marks a letter
   int commandID = 0;
 };
 
@@ -29,7 +29,7 @@ char LetterOf(const std::string& itemText);
 class CMenuWindow : public CTopWindow {
  public:
   /// The menu opens downwards from a place on the screen. It asks which items are enabled once,
-  /// when it opens.
+  /// when it opens. What is called when it has closed must not destroy it.
   CMenuWindow(const MenuTemplate& menu, Point at, std::function<void()> onClosed);
 
   /// Highlights the first item, as a menu opened by a key does.

@@ -23,6 +23,7 @@ struct Message {
 /// The messages that wait to be handled, oldest first, and the one place where the layer waits.
 class CMessageQueue {
  public:
+  /// Puts a message behind those that wait.
   void Post(const Message& message) { m_arrMessages.push_back(message); }
   void PostCommand(int commandID);
   void PostQuit(int exitCode);

@@ -16,10 +16,14 @@ class CScreen {
 
   /// Bottom to top.
   const std::vector<CTopWindow*>& Windows() const { return m_arrWindows; }
+  /// Null while no window is open.
   CTopWindow* Top() const { return m_arrWindows.empty() ? nullptr : m_arrWindows.back(); }
+  /// For CTopWindow::Open and Close. Whoever has the pointer loses it to a window that opens.
   void Push(CTopWindow& window);
   void Remove(CTopWindow& window);
 
+  /// Keys, texts and the wheel go to the topmost window only, a press to whatever lies there;
+  /// nothing to one that is disabled.
   void HandleInput(const InputEvent& event);
   /// Hands the pointer that is down over to another window until it is released.
   void Capture(CWindow& window) { m_pPressed = &window; }

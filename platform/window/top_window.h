@@ -16,6 +16,7 @@ class CTopWindow : public CWindow {
     kPopup,   ///< closes this one and does nothing else
   };
 
+  /// Not on the screen before it is opened.
   CTopWindow(std::string title, const Rect& place, Kind kind = Kind::kNormal);
   ~CTopWindow() override;
 
@@ -23,13 +24,15 @@ class CTopWindow : public CWindow {
   Kind GetKind() const { return m_eKind; }
   const CBitmap& Pixels() const { return m_pixels; }
 
-  /// Puts the window on top of the stack.
+  /// Puts the window, which is its maker's, on top of the stack.
   void Open();
-  /// Takes it off the stack.
+  /// Takes it off the stack; nothing where it is not there. Its destructor does it too.
   void Close();
 
+  /// Paints into its own pixels what was invalidated; the screen shows them at the next chance.
   void PaintIfNeeded();
 
+  /// The child that has the keyboard; null: the window itself.
   CWindow* GetFocus() const { return m_pFocus; }
   /// Gives the keyboard to a child; null: to the window itself.
   void SetFocus(CWindow* child);

@@ -25,10 +25,13 @@ class CWindow {
   CWindow(const CWindow&) = delete;
   CWindow& operator=(const CWindow&) = delete;
 
+  /// Null for a top-level window.
   CWindow* GetParent() const { return m_pParent; }
   CTopWindow& TopLevel();
 
+  /// In its parent's pixels, or on the screen.
   const Rect& GetPlace() const { return m_rcPlace; }
+  /// Moves it within its parent. A top-level window keeps its size, and the screen must be told.
   void SetPlace(const Rect& place);
   Rect GetClientRect() const { return RectAt({}, {m_rcPlace.Width(), m_rcPlace.Height()}); }
   /// Where the client area's corner stands on the screen.
@@ -64,11 +67,13 @@ class CWindow {
   /// The press that this window had is over without a release: it was disabled or hidden meanwhile,
   /// or another window opened.
   virtual void OnPressLost() {}
+  /// In notches, away from the person is positive.
   virtual void OnMouseWheel(int) {}
   /// The middle button went down on this window; the text is what is marked on the desktop.
   virtual void OnMiddleClick(Point, const std::string&) {}
   /// Answers whether the key meant something here; otherwise the parent is asked.
   virtual bool OnKeyDown(const KeyStroke&) { return false; }
+  /// Typed text in UTF-8, one letter or several; returns as OnKeyDown does.
   virtual bool OnChar(const std::string&) { return false; }
   /// What an input method has not finished yet, each time it changes; empty: it is done with it.
   virtual bool OnComposition(const std::string&) { return false; }

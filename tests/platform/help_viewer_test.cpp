@@ -12,7 +12,7 @@
 namespace feltside::tests {
 namespace {
 
-TEST(HelpViewerTest, StartsTheDesktopsOpenerAndKnowsWhereThereIsNone) {
+TEST(HelpViewerTest, StartsTheDesktopsOpenerAndKnowsWhereItIsMissingOrFails) {
   const TemporaryFolder folder;
   const auto opener = folder.Path() / "xdg-open";
   const auto heard = folder.Path() / "heard";
@@ -21,17 +21,21 @@ TEST(HelpViewerTest, StartsTheDesktopsOpenerAndKnowsWhereThereIsNone) {
   WriteFile(folder.Path() / "help" / "page-topic.htm", "");
   setenv("PATH", folder.Path().c_str(), 1);
   const auto start = [&folder](const std::string& commandLine) {
-    return platform::StartHelpViewer({folder.Path() / "none", folder.Path() / "help"}, commandLine);
+    return platform::StartHelpViewer({folder.Path() / "none", folder.Path() / "help"}, commandLine,
+                                     60000);
   };
 
   // Trouble is told with the path of what is there, or should be.
   const std::string page = (folder.Path() / "help" / "page-topic.htm").string();
-  EXPECT_NE(start("file:page.htm#topic").find(" " + page + " "), std::string::npos);
+  EXPECT_NE(start("file:page.htm#topic").find(" " + page + "."), std::string::npos);
+  WriteFile(opener, "#!/bin/sh\nexit 3\n");
+  chmod(opener.c_str(), 0700);
+  EXPECT_NE(start("file:page.htm#topic").find(" " + page + "."), std::string::npos);
   EXPECT_NE(start("file:missing.htm").find(folder.Path().string()), std::string::npos);
   // Reading from a pipe waits until the opener has written into it.
   mkfifo(heard.c_str(), 0600);
-  WriteFile(opener, "#!/bin/sh\necho noise; echo noise >&2\necho \"$1\" >" + heard.string() + "\n");
-  chmod(opener.c_str(), 0700);
+  WriteFile(opener,
+            "#!/bin/sh\necho noise; echo noise >&2\necho \"$1\" >" + heard.string() + " &\n");
   testing::internal::CaptureStdout();
   testing::internal::CaptureStderr();
   for (const auto& [commandLine, opened] :

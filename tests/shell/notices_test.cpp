@@ -61,6 +61,28 @@ TEST(Notices, AreShownAtTheEndAtTheLatest) {
   EXPECT_FALSE(desk.Run());
 }
 
+TEST(Notices, TellOfSettingsThatCannotBeReadOrKept) {
+  Desk desk("[broken");
+  const std::string file = (desk.Host().ProfileFolder() / "Quillworks" / "Feltside.toml").string();
+  EXPECT_EQ(BoxText(desk).find("The settings"), 0U);
+  EXPECT_NE(BoxText(desk).find(file), std::string::npos);
+  Press(desk, {"Enter"});
+  std::filesystem::remove_all(desk.Host().ProfileFolder() / "Quillworks");
+  WriteFile(desk.Host().ProfileFolder() / "Quillworks", "in the way of a folder");
+  desk.Command(kCommandTableSetup);
+  Press(desk, {"Shift+Tab", "Shift+Tab", "Enter"});
+  EXPECT_NE(BoxText(desk).find(file), std::string::npos);
+}
+
+TEST(Notices, TellOfAnEndThatKeepsNothing) {
+  Desk desk;
+  WriteFile(desk.Host().ProfileFolder() / "Quillworks", "in the way of a folder");
+  desk.Host().SetWindowPlace({{1, 2, 300, 400}, false});
+  desk.Host().PutPointer(platform::InputKind::kClose, {});
+  EXPECT_TRUE(desk.Run());
+  EXPECT_EQ(BoxText(desk).find("The settings"), 0U);
+}
+
 TEST(Notices, LetTheWindowBeClosed) {
   Desk desk;
   platform::TheApp().Notify("No disk.");
