@@ -211,7 +211,7 @@ TEST_F(SdlHostTest, RefusesWhatIsDropped) {
 /// Whether a place of the window shows a pixel of the frame, mixed with no more than as much of its
 /// neighbours.
 bool IsSeenAt(const SDL_Surface& screen, Point at, Point inFrame) {
-  const auto* line = static_cast<const Uint8*>(screen.pixels) + at.y * screen.pitch;
+  const auto* line = static_cast<const Uint8*>(screen.pixels) + std::ptrdiff_t{screen.pitch} * at.y;
   const Pixel pixel = reinterpret_cast<const Pixel*>(line)[at.x];
   const auto is = [](Pixel level, int cell) {
     return std::abs(static_cast<int>(level & 0xFF) - cell * kStep) <= kStep / 2 + 1;
