@@ -15,10 +15,9 @@ class Mixture {
     m_nRed += (pixel >> 16 & 0xFF) * share;
     m_nGreen += (pixel >> 8 & 0xFF) * share;
     m_nBlue += (pixel & 0xFF) * share;
-    m_nShares += share;
   }
-  Pixel Result() const {
-    const unsigned shares = std::max(1U, m_nShares);
+  /// The mixture of so many shares in all.
+  Pixel Of(unsigned shares) const {
     const auto part = [shares](unsigned sum) { return (sum + shares / 2) / shares; };
     return 0xFF000000U | part(m_nRed) << 16 | part(m_nGreen) << 8 | part(m_nBlue);
   }
@@ -27,7 +26,6 @@ class Mixture {
   unsigned m_nRed = 0;
   unsigned m_nGreen = 0;
   unsigned m_nBlue = 0;
-  unsigned m_nShares = 0;
 };
 
 /// Which of a line of source cells lie under one of a line of target cells of the same length.
@@ -38,7 +36,8 @@ class Cover {
 
   int First() const { return m_nBegin / m_nUnit; }
   int Last() const { return (m_nEnd - 1) / m_nUnit; }
-  /// How much of the target cell a source cell takes.
+  unsigned Shares() const { return static_cast<unsigned>(m_nEnd - m_nBegin); }
+  /// How many of all shares of the target cell a source cell has.
   unsigned ShareOf(int source) const {
     return static_cast<unsigned>(std::min(m_nEnd, (source + 1) * m_nUnit) -
                                  std::max(m_nBegin, source * m_nUnit));
@@ -79,7 +78,7 @@ class WideRow {
     for (int x = cover.First(); x <= cover.Last(); ++x) {
       mixture.Add(m_frame.At({x, y}), cover.ShareOf(x));
     }
-    return mixture.Result();
+    return mixture.Of(cover.Shares());
   }
 
   const CBitmap& m_frame;
@@ -95,7 +94,7 @@ Row MixedRow(WideRow& source, const Cover& cover, int width) {
     for (std::size_t x = 0; x < row.size(); ++x) mixtures[x].Add(row[x], cover.ShareOf(y));
   }
   Row mixed;
-  for (const Mixture& mixture : mixtures) mixed.push_back(mixture.Result());
+  for (const Mixture& mixture : mixtures) mixed.push_back(mixture.Of(cover.Shares()));
   return mixed;
 }
 

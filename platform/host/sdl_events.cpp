@@ -93,7 +93,7 @@ bool SdlEvents::OnWheel(const SDL_MouseWheelEvent& wheel, InputEvent& event) con
 
 bool SdlEvents::OnKeyDown(const SDL_KeyboardEvent& key, InputEvent& event) {
   if (key.keysym.sym == SDLK_F11) {
-    if (key.repeat == 0) m_window.ToggleFullScreen();
+    if (key.repeat == 0) m_window.Placement().ToggleFullScreen();
     return false;
   }
   event.kind = InputKind::kKey;

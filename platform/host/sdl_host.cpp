@@ -31,8 +31,8 @@ class SdlHost : public Host {
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) override {
     m_window.SetIdentity(title, icon);
   }
-  void SetWindowPlace(const WindowPlace& place) override { m_window.SetPlace(place); }
-  std::optional<WindowPlace> GetWindowPlace() override { return m_window.GetPlace(); }
+  void SetWindowPlace(const WindowPlace& place) override { m_window.Placement().Ask(place); }
+  std::optional<WindowPlace> GetWindowPlace() override { return m_window.Placement().Place(); }
 
   bool NextEvent(InputEvent& event) override {
     SDL_Event raw;

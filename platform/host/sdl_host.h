@@ -16,8 +16,8 @@ struct SdlHostOptions {
   std::vector<std::filesystem::path> helpFolders;
 };
 
-/// A host with a window of the desktop, shown at a whole multiple of its pixels. Null where there
-/// is no display to show a window on; `why` then says what is the matter.
+/// A host with a window of the desktop, which shows the picture in whatever room it has. Null where
+/// there is no display to show a window on; `why` then says what is the matter.
 std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& why);
 
 }  // namespace platform

@@ -6,9 +6,8 @@
 #include <string>
 
 #include "platform/draw/bitmap.h"
-#include "platform/host/frame_fit.h"
 #include "platform/host/sdl_canvas.h"
-#include "platform/host/window_place.h"
+#include "platform/host/sdl_placement.h"
 
 namespace platform {
 
@@ -23,13 +22,10 @@ class SdlWindow {
   SdlWindow& operator=(const SdlWindow&) = delete;
 
   /// Whether there is something to draw on.
-  bool IsOpen() const { return m_bOpen; }
+  bool IsOpen() const { return m_placement.has_value(); }
   void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon);
 
-  /// Before the first picture is shown; a place that has left the desktop is moved onto it.
-  void SetPlace(const WindowPlace& place);
-  /// Nothing where neither SetPlace nor the person has put the window anywhere.
-  std::optional<WindowPlace> GetPlace() const;
+  SdlPlacement& Placement() { return *m_placement; }
 
   void Show(const CBitmap& frame);
   /// Takes note that the desktop wants the picture again, or has put the window elsewhere.
@@ -37,8 +33,6 @@ class SdlWindow {
   /// Does what events left to be done, once for all of them.
   void Settle();
 
-  /// Fills the display or goes back, also on desktops that know no such thing.
-  void ToggleFullScreen();
   /// The pixel of the picture under a place; may lie beside the picture.
   Point FramePoint(Point at) const;
   /// Where pixels of the picture are seen.
@@ -47,19 +41,7 @@ class SdlWindow {
  private:
   bool Open(bool plain);
   void Close();
-  /// Is seen for the first time.
-  void Appear();
-  Rect CurrentRect() const;
-  /// The nearest place on a display that is there now.
-  Rect OnDesktop(const Rect& rect) const;
-  /// Of the window manager's bar above the window; 0 where none can be told.
-  int BarHeight() const;
-  void PutAt(const Rect& rect);
-  bool IsFullScreen() const;
-  /// In full screen: whether it was before.
-  bool IsMaximized() const;
-  void EnterFullScreen();
-  void LeaveFullScreen();
+  Size GetSize() const;
   Size SizeInPixels() const;
   void Draw();
 
@@ -67,16 +49,9 @@ class SdlWindow {
   CBitmap m_frame;
   SDL_Window* m_pWindow = nullptr;
   SdlCanvas m_canvas;
-  bool m_bOpen = false;
+  std::optional<SdlPlacement> m_placement;  ///< of an open window
   bool m_bShown = false;
-  bool m_bStale = false;         ///< the desktop does not show the picture as it should be
-  bool m_bFillsDisplay = false;  ///< by its size alone, as the desktop knows no full screen
-  bool m_bPlaced = false;        ///< by SetPlace
-  bool m_bOpensMaximized = false;
-  bool m_bMaximizedBefore = false;  ///< before it filled the display
-  Rect m_rcAsked;                   ///< where the window was to open
-  Rect m_rcOpened;                  ///< where the desktop then put it
-  Rect m_rcNormal;  ///< where it last stood, neither maximised nor filling the display
+  bool m_bStale = false;  ///< the desktop does not show the picture as it should be
 };
 
 }  // namespace platform

@@ -16,7 +16,8 @@ TEST(HelpViewerTest, StartsTheDesktopsOpenerAndKnowsWhereItIsMissingOrFails) {
   const TemporaryFolder folder;
   const auto opener = folder.Path() / "xdg-open";
   const auto heard = folder.Path() / "heard";
-  const std::string path = std::getenv("PATH");
+  const char* set = std::getenv("PATH");
+  const std::string path = set == nullptr ? "" : set;
   WriteFile(folder.Path() / "help" / "page.htm", "");
   WriteFile(folder.Path() / "help" / "page-topic.htm", "");
   setenv("PATH", folder.Path().c_str(), 1);
