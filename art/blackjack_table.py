@@ -26,12 +26,15 @@ _TEXT_BLANK = 2.6
 _TEXT_STROKE = 0.58
 
 _MEDALLION = (180, 118)
-_DEALERS_TRAY = (77, 8, 146, 53)
-# From side to side: one hand in the middle of it, two of a split, their names and their totals all
-# lie on it.
-_PLAYERS_TRAY = (10, 214, 230, 261)
-_TRAYS = (_DEALERS_TRAY, _PLAYERS_TRAY)
-_TRAY_INK = 6
+# Dealer and player each have the whole end of the table behind a line as their field: cards, names
+# and totals lie on it, those of one hand and those of two.
+_DEALERS_LINE, _PLAYERS_LINE = 195, 321
+_FIELD_INK, _CLOTH_INK = 4, 8
+_NOTCH = 10
+_INSIDE_FRAME = 6
+# In each field a row of suits, above the player's totals and below the dealer's.
+_SUIT_ROWS = (38, 230)
+_SUITS_IN_ROW, _SUIT_STEP = 8, 15
 
 
 class Paper:
@@ -68,31 +71,18 @@ def _arc_radius(x, y):
 
 def _arc(inner, outer):
     """A line across the table, from frame to frame."""
-    within_frame = _notched(6, 18)
+    within_frame = _notched(_INSIDE_FRAME)
     return lambda x, y: inner <= _arc_radius(x, y) < outer and within_frame(x, y)
 
 
-def _rounded(left, top, right, bottom, radius):
-    """A rectangle with rounded corners."""
+def _notched(inset):
+    """The whole picture less an inset, a quarter circle cut out of each corner.
+
+    The circles are small, as the total of the right hand of a split stands beside the lower one.
+    """
     def inside(x, y):
-        dx = max(left + radius - x, x - (right - radius), 0)
-        dy = max(top + radius - y, y - (bottom - radius), 0)
-        return left <= x < right and top <= y < bottom and dx * dx + dy * dy <= radius * radius
-    return inside
-
-
-def _notched(inset, notch):
-    """The whole picture less an inset, a quarter circle cut out of each corner at the dealer's end,
-    the player's end rounded."""
-    radius = max(10 - inset, 0)
-
-    def inside(x, y):
-        dx, dy = min(x, WIDTH - x) - inset, min(y, HEIGHT - y) - inset
-        if dx < 0 or dy < 0:
-            return False
-        if y < HEIGHT / 2:
-            return math.hypot(dx, dy) >= notch
-        return math.hypot(max(radius - dx, 0), max(radius - dy, 0)) <= radius
+        dx, dy = min(x, WIDTH - x), min(y, HEIGHT - y)
+        return min(dx, dy) >= inset and math.hypot(dx, dy) >= _NOTCH + inset
     return inside
 
 
@@ -127,14 +117,10 @@ def _lay_letter(paper, letter, place, width):
 
 def _bare(x, y):
     """Whether a small suit of the cloth has room at a point."""
-    if _arc_radius(x, y) < 231 and _arc_radius(x, y) > 187:
+    radius = _arc_radius(x, y)
+    if radius < 231 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
         return False
-    if abs(_arc_radius(x, y) - 321) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
-        return False
-    for left, top, right, bottom in _TRAYS:
-        if left - 8 < x < right + 8 and top - 8 < y < bottom + 8:
-            return False
-    return _notched(13, 16)(x, y)
+    return 14 < x < WIDTH - 14 and y < _SUIT_ROWS[1] - 12
 
 
 def _lay_cloth(paper):
@@ -144,7 +130,7 @@ def _lay_cloth(paper):
         for column in range(WIDTH // (2 * step) + 2):
             x, y = 2 * step * column + (row % 2) * step, row * step - 6
             if _bare(x, y):
-                paper.lay_placed(shapes.SUITS[(row + 2 * column) % 4], x, y, 5, 7)
+                paper.lay_placed(shapes.SUITS[(row + 2 * column) % 4], x, y, 5, _CLOTH_INK)
 
 
 def _lay_medallion(paper):
@@ -161,25 +147,22 @@ def _lay_medallion(paper):
     paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
 
 
-def _lay_tray(paper, tray):
-    left, top, right, bottom = tray
-    whole, inner = _rounded(*tray, 4), _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)
-    paper.lay(_outline(whole, inner), INK_LIMIT, tray)
-    paper.lay(inner, _TRAY_INK, tray)
-
-
-def _lay_suits(paper, tray):
-    left, top, right, bottom = tray
-    for place, suit in enumerate(shapes.SUITS):
-        x = (left + right) / 2 + 15 * (place - 1.5)
-        paper.lay_placed(suit, x, (top + bottom) / 2, 6, 16)
+def _lay_fields(paper):
+    inside = _notched(_INSIDE_FRAME)
+    paper.lay(lambda x, y: inside(x, y) and not _DEALERS_LINE <= _arc_radius(x, y) < _PLAYERS_LINE,
+              _FIELD_INK)
+    for y in _SUIT_ROWS:
+        for place in range(_SUITS_IN_ROW):
+            x = WIDTH / 2 + _SUIT_STEP * (place - (_SUITS_IN_ROW - 1) / 2)
+            paper.lay_placed(shapes.SUITS[place % 4], x, y, 6, 16)
 
 
 def _lay_frame(paper):
-    paper.lay(_outline(_notched(2, 17), _notched(3, 18)), INK_LIMIT)
-    paper.lay(_outline(_notched(5, 17), _notched(6, 18)), 18)
-    for suit, x in ((shapes.spade, 8), (shapes.heart, WIDTH - 8)):
-        paper.lay_placed(suit, x, 8, 6, 24)
+    paper.lay(_outline(_notched(2), _notched(3)), INK_LIMIT)
+    paper.lay(_outline(_notched(5), _notched(_INSIDE_FRAME)), 18)
+    for suit, x, y in ((shapes.spade, 6, 6), (shapes.heart, WIDTH - 6, 6),
+                       (shapes.diamond, 6, HEIGHT - 6), (shapes.club, WIDTH - 6, HEIGHT - 6)):
+        paper.lay_placed(suit, x, y, 4.5, 24)
 
 
 def blackjack_table():
@@ -191,9 +174,7 @@ def blackjack_table():
         paper.lay(_arc(inner, outer), ink)
     _lay_inscription(paper)
     _lay_medallion(paper)
-    for tray in _TRAYS:
-        _lay_tray(paper, tray)
-    _lay_suits(paper, _DEALERS_TRAY)
+    _lay_fields(paper)
     _lay_frame(paper)
     return paper.canvas()
 

@@ -45,15 +45,15 @@ def bet_button(name, live):
 
 
 def lamp(name, colours):
-    """A round lamp, lit, in a black socket; `colours` go from the rim of the glass to its middle.
+    """A round lamp, lit, in a metal fitting; `colours` go from the rim of the glass to its middle.
 
-    The picture is copied as a block on a ground of any colour, so the socket is square; there is no
-    bevel about it, as nothing happens when it is pressed. The sign tells right from wrong without
-    the colour.
+    The picture is copied as a block on a ground of any colour, so the fitting is square and has the
+    black outline of the box that it is set into; its plate is flat, as nothing happens when it is
+    pressed. The sign tells right from wrong without the colour.
     """
     picture = Canvas(13, 13, "black")
     picture.text_grid(0, 0, read_grids(_SOURCES / "lamp.txt")["lamp"],
-                      {"#": "black", "+": "ink", **dict(zip("dcl", colours))})
+                      {"#": "black", "p": "steel_light", "s": "steel", **dict(zip("dcl", colours))})
     sign(picture, 3, 3, name, "white")
     return picture
 

@@ -43,8 +43,8 @@ PIP_PLACES = {
     "8": (_pairs(3) + ((MIDDLE, 10),), _pairs(17)),
     "9": (_pairs(2, 10), ((MIDDLE, 17),)),
     "10": (_pairs(2, 13) + ((MIDDLE, 8),), ()),
-    # A row further apart, as the leaves of two clubs would touch.
-    "10 of clubs": (_pairs(2, 14) + ((MIDDLE, 8),), ()),
+    # Five rows of two: between four rows the leaves of a single club would have no air about them.
+    "10 of clubs": (_pairs(2, 10), _pairs(17)),
 }
 PIP_SIZES = {"2": "big", "3": "big", "4": "medium", "5": "medium", "6": "medium"}
 

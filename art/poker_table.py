@@ -17,8 +17,11 @@ SEEN_HEIGHT = 268
 
 # Where the game puts things: left, top, right, bottom.
 BUTTON = (70, 180, 155, 215)
-WALLET = (2, 230, 117, 254)
-RESULT = (121, 230, 239, 254)
+# The panels reach from one side post to the other, as the longest result ends eight columns before
+# the right edge of the picture. LEFT and RIGHT are those of what is inside their frames.
+LEFT, RIGHT = 3, WIDTH - 3
+WALLET = (LEFT, 230, 116, 254)
+RESULT = (WIDTH - 116, 230, RIGHT, 254)
 CARDS = [(x, 114, x + 29, 155) for x in (40, 73, 106, 139, 172)]
 
 PAYS = (
@@ -47,9 +50,8 @@ def grown(box, by):
 
 
 def sunk_panel(picture, box, face):
-    """A flat panel let into the cabinet, its frame two pixels wide around the box."""
-    bevel(picture, grown(box, 2), night(3), night(12))
-    bevel(picture, grown(box, 1), night(0), night(9))
+    """A flat panel let into the cabinet, its frame one pixel wide around the box."""
+    bevel(picture, grown(box, 1), night(0), night(12))
     picture.rect(*box, face)
 
 
@@ -70,12 +72,12 @@ _MIX = ((0, 8, 2, 10), (12, 4, 14, 6), (3, 11, 1, 9), (15, 7, 13, 5))
 def cabinet(picture):
     """The body, lit from above, and the desk that carries the button and the panels."""
     shaded(picture, (0, 0, WIDTH, HEIGHT), 8, 4)
-    for inset, light, dark in ((0, 14, 2), (1, 11, 3), (2, 3, 9)):
+    for inset, light, dark in ((0, 14, 2), (1, 11, 3)):
         bevel(picture, (inset, inset, WIDTH - inset, SEEN_HEIGHT - inset),
               night(light), night(dark))
-    shaded(picture, (3, 167, WIDTH - 3, SEEN_HEIGHT - 3), 9, 6)
-    picture.rect(3, 165, WIDTH - 3, 166, night(2))
-    picture.rect(3, 166, WIDTH - 3, 167, night(14))
+    shaded(picture, (2, 167, WIDTH - 2, SEEN_HEIGHT - 2), 9, 6)
+    picture.rect(2, 165, WIDTH - 2, 166, night(2))
+    picture.rect(2, 166, WIDTH - 2, 167, night(14))
 
 
 def soft_suit(picture, shape, x, y, half_height, ramp):
@@ -98,12 +100,12 @@ def bulb(picture, x, y, lit):
 
 
 def marquee(picture):
-    box = (9, 8, 231, 37)
+    box = (LEFT, 7, RIGHT, 37)
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
-    for place in range(28):
-        for y in (top, bottom - 3):
-            bulb(picture, left + 2 + 8 * place, y, (place + (y > 20)) % 2 == 0)
+    for place in range(29):
+        for y in (top + 1, bottom - 4):
+            bulb(picture, left + 4 + 8 * place, y, (place + (y > 20)) % 2 == 0)
     BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
     BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
     nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
@@ -111,18 +113,19 @@ def marquee(picture):
 
 
 def pay_table(picture):
-    box = (9, 42, 231, 105)
+    box = (LEFT, 42, RIGHT, 105)
     sunk_panel(picture, box, night(3))
     left, top, right, _ = box
     middle, pitch = (left + right) // 2, 16
+    half = middle - left
     for place, (name, pays) in enumerate(PAYS):
         column, row = divmod(place, 4)
         x, y = (middle if column else left), top + pitch * row
         if row % 2:
-            picture.rect(x, y - 1, x + 111, y + pitch - 1, night(2))
+            picture.rect(x, y - 1, x + half, y + pitch - 1, night(2))
         best = place == 0
-        PLAIN.write(picture, x + 7, y + 4, name, "gold_light" if best else night(19))
-        BOLD.write_right(picture, x + 104, y + 4, pays, "gold_light")
+        PLAIN.write(picture, x + 8, y + 4, name, "gold_light" if best else night(19))
+        BOLD.write_right(picture, x + half - 8, y + 4, pays, "gold_light")
     picture.rect(middle - 1, top, middle, top + 63, night(0))
     picture.rect(middle, top, middle + 1, top + 63, night(7))
 
@@ -164,18 +167,9 @@ def _small_card(picture, x, y, face, edge):
     picture.rect(x + 2, y + 2, x + 8, y + 12, face)
 
 
-def display(picture):
-    """A strip of glass from side to side of the cabinet, lit in two colours: the longest result
-    needs nearly all of its half."""
-    left, top, right, bottom = 1, WALLET[1], WIDTH - 1, WALLET[3]
-    for y, step in ((top - 2, 3), (top - 1, 0), (bottom, 9), (bottom + 1, 12)):
-        picture.rect(left, y, right, y + 1, night(step))
-    picture.rect(left, top - 1, left + 1, bottom, night(0))
-    for box, face in ((WALLET, "cell_blue"), (RESULT, "cell_slate")):
-        picture.rect(*box, face)
-    post = WALLET[2]
-    for x, step in enumerate((9, 7, 5, 1), post):
-        picture.rect(x, top - 1, x + 1, bottom + 1, night(step))
+def displays(picture):
+    sunk_panel(picture, WALLET, "cell_blue")
+    sunk_panel(picture, RESULT, "cell_slate")
 
 
 def desk(picture):
@@ -197,8 +191,8 @@ def desk(picture):
 
 
 def labels(picture):
-    TINY.write(picture, 9, 221, "WALLET", night(18))
-    TINY.write(picture, RESULT[0] + 4, 221, "RESULT", night(18))
+    for (left, top, _, _), label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
+        TINY.write(picture, left + 5, top - 9, label, night(18))
 
 
 def poker_table():
@@ -209,7 +203,7 @@ def poker_table():
     card_bay(picture)
     desk(picture)
     button(picture)
-    display(picture)
+    displays(picture)
     labels(picture)
     return picture
 

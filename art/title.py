@@ -17,6 +17,7 @@ _RAIL = 6
 _RAIL_DEPTH = 4
 
 _CARD_WIDTH, _CARD_HEIGHT = 34, 48
+_LEAN = 7
 _SIGNS = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "title.txt")
 
 
@@ -58,7 +59,8 @@ def felt_colour(dx, dy):
 class LeaningCard:
     """A large card that leans by a pixel in so many, to the left (below 0) or to the right.
 
-    It leans by moving its rows and then its columns on, so that no pixel is lost or mixed.
+    Its edges lean in even steps; what is drawn on it stands upright, as a sign of few pixels would
+    be torn by the steps.
     """
 
     def __init__(self, lean):
@@ -70,10 +72,10 @@ class LeaningCard:
         for x in (0, _CARD_WIDTH - 1):
             for y in (0, _CARD_HEIGHT - 1):
                 card.put(x, y, "nothing")
-        self.lay(card)
+        self._lay(card)
 
-    def lay(self, flat):
-        """Lays what is drawn on an upright card."""
+    def _lay(self, flat):
+        """Lays an upright card, its rows and then its columns moved on."""
         right, step = self._lean > 0, abs(self._lean)
         for y in range(flat.height):
             for x in range(flat.width):
@@ -83,7 +85,7 @@ class LeaningCard:
                     self.canvas.put(column, row, flat.get(x, y))
 
     def sign_corners(self, places, colour):
-        """Sets signs that lean already, and the same upside down."""
+        """Sets signs, and the same upside down."""
         corner = Canvas(self.canvas.width, self.canvas.height, "nothing")
         for x, y, name in places:
             corner.text_grid(x, y, _SIGNS[name], {"#": colour})
@@ -92,23 +94,23 @@ class LeaningCard:
 
 
 def ace_of_spades():
-    card = LeaningCard(5)
-    card.canvas.text_grid(12, 17, _SIGNS["spade"], {"#": "ink"})
-    card.sign_corners(((11, 5, "ace letter"), (10, 14, "ace suit")), "ink")
+    card = LeaningCard(_LEAN)
+    card.canvas.text_grid(12, 18, _SIGNS["spade"], {"#": "ink"})
+    card.sign_corners(((8, 4, "ace letter"), (8, 13, "ace suit")), "ink")
     return card.canvas
 
 
 def queen_of_hearts():
-    """The game's own queen, her sleeves drawn out to the edges of the larger card."""
-    card, small = LeaningCard(-5), cards.new_card()
+    """The game's own queen, who ends in her sleeves some pixels inside the edges."""
+    card, small = LeaningCard(-_LEAN), cards.new_card()
     courts.draw(small, "hearts", "queen")
-    left, top = (_CARD_WIDTH - small.width) // 2, (_CARD_HEIGHT - small.height) // 2
-    figure = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "nothing")
+    left = (card.canvas.width - small.width) // 2
+    top = (card.canvas.height - small.height) // 2
     for y in range(2, small.height - 2):
-        for x in range(1, _CARD_WIDTH - 1):
-            figure.put(x, y + top, small.get(min(max(x - left, 1), small.width - 2), y))
-    card.lay(figure)
-    card.sign_corners(((3, 10, "queen letter"), (3, 20, "queen suit")), "card_red")
+        for x in range(3, small.width - 3):
+            if small.get(x, y) != "white":
+                card.canvas.put(x + left, y + top, small.get(x, y))
+    card.sign_corners(((3, 8, "queen letter"), (3, 17, "queen suit")), "card_red")
     return card.canvas
 
 
@@ -122,8 +124,8 @@ def title():
     picture = Canvas(WIDTH, HEIGHT)
     table(picture)
     fill(picture, ellipse(50, 82, 24, 6), "felt_1")
-    picture.blit(queen_of_hearts(), 12, 27, "nothing")
-    picture.blit(ace_of_spades(), 37, 27, "nothing")
+    picture.blit(queen_of_hearts(), 14, 27, "nothing")
+    picture.blit(ace_of_spades(), 42, 27, "nothing")
     chip_stack(picture, 12, 88, 4, chips.RED)
     chip_stack(picture, 65, 88, 3, chips.BLUE)
     chip_stack(picture, 39, 94, 1, chips.BLACK)

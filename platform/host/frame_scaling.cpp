@@ -18,7 +18,8 @@ class Mixture {
     m_nShares += share;
   }
   Pixel Result() const {
-    const auto part = [this](unsigned sum) { return (sum + m_nShares / 2) / m_nShares; };
+    const unsigned shares = std::max(1U, m_nShares);
+    const auto part = [shares](unsigned sum) { return (sum + shares / 2) / shares; };
     return 0xFF000000U | part(m_nRed) << 16 | part(m_nGreen) << 8 | part(m_nBlue);
   }
 

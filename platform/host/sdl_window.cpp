@@ -1,6 +1,7 @@
 #include "platform/host/sdl_window.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <string_view>
 
 #include "platform/host/frame_scaling.h"
@@ -61,10 +62,12 @@ void SetIcon(SDL_Window* window, const CBitmap& icon) {
 void DrawScaled(const CBitmap& frame, const Rect& place, const SDL_Surface& canvas) {
   const int width = place.Width();
   ScaleFrame(frame, {width, place.Height()}, [&](int y, const std::vector<Pixel>& row) {
-    auto* line = static_cast<Uint8*>(canvas.pixels) + (place.top + y) * canvas.pitch;
+    const std::ptrdiff_t down = place.top + y;
+    const std::ptrdiff_t across = place.left;
+    auto* line = static_cast<Uint8*>(canvas.pixels) + down * canvas.pitch +
+                 across * canvas.format->BytesPerPixel;
     SDL_ConvertPixels(width, 1, SDL_PIXELFORMAT_ARGB8888, row.data(), width * 4,
-                      canvas.format->format, line + place.left * canvas.format->BytesPerPixel,
-                      canvas.pitch);
+                      canvas.format->format, line, canvas.pitch);
   });
 }
 
