@@ -8,7 +8,6 @@
 #include "platform/draw/wrapped_text.h"
 #include "platform/window/application.h"
 #include "tests/support/desk.h"
-#include "tests/support/script.h"
 
 namespace feltside::tests {
 namespace {
@@ -47,29 +46,6 @@ TEST(Screen, IsShownWholeWithASmallWindowAlone) {
   host.SetFrameHandler([&host] { EXPECT_EQ(host.Shown().GetSize(), kScreen); });
   App([] { platform::MessageBox("Too early"); }).Main();
   EXPECT_EQ(host.Shown().GetSize(), kScreen);
-}
-
-platform::CBitmap ShotAfter(const std::vector<std::string>& commands) {
-  Stylus stylus;
-  for (const std::string& command : commands) Do(stylus, command);
-  return stylus.Shot();
-}
-
-TEST(Windows, LeaveNothingBehindThemWhenTheyGo) {
-  using Commands = std::vector<std::string>;
-  const std::string cards = "stack TH 2D KS 7C 2C 2H";
-  const std::vector<std::pair<Commands, Commands>> cases = {
-      {{"command 32777", "key Tab", "key Tab"},
-       {"command 32777", "key Tab", "key Tab", "key F4", "key Escape"}},
-      {{}, {"key F10", "key Escape"}},
-      {{}, {"command 32779", "down 55 26", "move 300 300", "up 300 300", "key Escape"}},
-      {{}, {"down 186 12", "up 5 200"}},
-      {{cards, "command 32776", "key H", "key H"},
-       {cards, "command 32776", "key H", "down 75 12", "up 75 12"}}};
-  for (const auto& [without, with] : cases) {
-    EXPECT_TRUE(ShotAfter(with).Pixels() == ShotAfter(without).Pixels())
-        << testing::PrintToString(with);
-  }
 }
 
 class OneList : public platform::CDialog {

@@ -74,7 +74,8 @@ std::string WrongCommands(const Json& s) {
       {"split", playing && !split && IsPair(s["m_handPlayer"])},
       {"deal", s["m_bHandInProgress"] == 0 && s["windows"].size() == 1}};
   for (const auto& [command, enabled] : expected) {
-    if (s["windows"].size() == 1 && s["enabled"][std::to_string(ToCommand(command))] != enabled) {
+    if (s["windows"].size() == 1 &&
+        s["enabled"].at(std::to_string(ToCommand(command))) != enabled) {
       return command + (enabled ? " is disabled\n" : " is enabled\n");
     }
   }

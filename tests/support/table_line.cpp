@@ -34,7 +34,7 @@ std::string Moves(const Json& state) {
   const Json& enabled = state["enabled"];
   if (state["m_bInsuranceOffered"] == 1) return "Insurance?";
   const auto move = [&enabled](int commandID, const char* name) {
-    return std::string(enabled[std::to_string(commandID)] ? name : "");
+    return std::string(enabled.at(std::to_string(commandID)) ? name : "");
   };
   return move(kCommandHit, "H") + move(kCommandStand, "S") + move(kCommandDoubleDown, "D") +
          move(kCommandSplit, "P") + move(kCommandDeal, "Deal");
