@@ -1,0 +1,4 @@
+# For Windows: one program that needs nothing installed.
+set(FELTSIDE_SIBLINGS sdl file windows)
+set(FELTSIDE_LIBRARIES SDL2 FREETYPE PNG)
+set(FELTSIDE_LINK_OPTIONS -static -Wl,--gc-sections)
