@@ -2,3 +2,5 @@
 set(FELTSIDE_SIBLINGS sdl file windows)
 set(FELTSIDE_LIBRARIES SDL2 FREETYPE PNG)
 set(FELTSIDE_LINK_OPTIONS -static -Wl,--gc-sections)
+# Beside the program.
+set(FELTSIDE_HELP_FOLDER help)

@@ -184,7 +184,7 @@ std::string CFileProfile::SetAside() {
 /// written in its place.
 std::string CFileProfile::KeepCopy(const std::string& text, const std::string& name) {
   const fs::path kept = NameForDamaged(m_file);
-  const std::error_code error = ReplaceFile(kept, text);
+  const std::error_code error = WriteWhole(kept, text);
   if (error) return "what it holds as " + name + " cannot be kept (" + Reason(error) + ")";
   Tell(Named() + " held something else as " + name + ". The file as it was is kept as " +
        kept.string() + ".");
@@ -202,7 +202,7 @@ std::string CFileProfile::Store(const std::string& section, const Change& change
   const auto changed = ChangeSection(stored.text, section, *stored.section);
   if (!changed) return "what else it holds cannot be written again";
   std::string refusal = changed->foreign.empty() ? "" : KeepCopy(stored.text, changed->foreign);
-  if (refusal.empty()) refusal = Reason(ReplaceFile(m_file, changed->text));
+  if (refusal.empty()) refusal = Reason(WriteWhole(m_file, changed->text));
   if (!refusal.empty()) ListLost(*stored.section);
   return refusal;
 }
