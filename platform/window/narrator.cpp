@@ -1,6 +1,7 @@
 #include "platform/window/narrator.h"
 
 #include <algorithm>
+#include <iterator>
 #include <utility>
 
 #include "platform/host/host.h"
@@ -9,17 +10,11 @@
 namespace platform {
 namespace {
 
-/// What stands in the one list and not in the other. What stands there twice was told twice.
-Phrases NewIn(const Phrases& now, Phrases before) {
+Phrases NewIn(const Phrases& now, const Phrases& before) {
   Phrases fresh;
-  for (const std::string& phrase : now) {
-    const auto told = std::find(before.begin(), before.end(), phrase);
-    if (told == before.end()) {
-      fresh.push_back(phrase);
-    } else {
-      before.erase(told);
-    }
-  }
+  std::copy_if(now.begin(), now.end(), std::back_inserter(fresh), [&](const std::string& phrase) {
+    return std::find(before.begin(), before.end(), phrase) == before.end();
+  });
   return fresh;
 }
 
@@ -44,7 +39,7 @@ void CNarrator::TellOf(const CTopWindow& window) {
     const std::string sentence = Sentence(phrase);
     text += (text.empty() || sentence.empty() ? "" : " ") + sentence;
   }
-  TheHost().Say(text);
+  if (!text.empty()) TheHost().Say(text);
 }
 
 }  // namespace platform
