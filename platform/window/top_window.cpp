@@ -14,9 +14,15 @@ CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
 
 CTopWindow::~CTopWindow() { Close(); }
 
-void CTopWindow::Open() { TheApp().Screen().Push(*this); }
+void CTopWindow::Open() {
+  TheApp().Screen().Push(*this);
+  TheApp().TellAnew();
+}
 
-void CTopWindow::Close() { TheApp().Screen().Remove(*this); }
+void CTopWindow::Close() {
+  TheApp().Screen().Remove(*this);
+  TheApp().TellAnew();
+}
 
 void CTopWindow::PaintIfNeeded() {
   if (PaintInto(m_pixels, {}, false)) TheApp().Screen().MarkStale();

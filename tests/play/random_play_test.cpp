@@ -9,6 +9,7 @@
 #include <memory>
 #include <random>
 
+#include "stylus/stylus_words.h"
 #include "tests/play/table_model.h"
 #include "tests/support/script.h"
 
@@ -17,6 +18,7 @@ namespace {
 
 constexpr int kCommands = 25000;
 constexpr int kLeaveEvery = 200;  ///< commands until all dialogs are left
+constexpr int kListenEvery = 7;   ///< commands until it is heard what was said
 constexpr int kMostEscapes = 6;
 
 using Texts = std::vector<std::string>;
@@ -164,6 +166,20 @@ bool PlayOn(Table& table, const std::string& command) {
   return answer["running"];
 }
 
+/// Whatever is said ends with what may be done by then.
+std::string WrongWords(const std::string& words, const Json& enabled) {
+  for (const auto& [command, phrase] :
+       std::map<std::string, std::string>{{"hit", "H to hit"},
+                                          {"stand", "S to stand"},
+                                          {"double", "D to double down"},
+                                          {"split", "P to split"},
+                                          {"deal", "Enter to deal"}}) {
+    const bool said = words.find(phrase) != std::string::npos;
+    if (said != enabled[std::to_string(ToCommand(command))]) return command + ": " + words;
+  }
+  return {};
+}
+
 class RandomPlay : public testing::TestWithParam<unsigned> {};
 
 /// One that nobody has seen before, or FELTSIDE_SEED, by which a failure is played again.
@@ -190,6 +206,10 @@ TEST_P(RandomPlay, KeepsTheTableInOrder) {
       command = "key Ctrl+N";
     }
     const bool runs = table->state["running"] && PlayOn(*table, command);
+    if (runs && i % kListenEvery == 0 && table->state["windows"].size() == 1) {
+      const std::string words = table->stylus.Send("words")["words"];
+      EXPECT_EQ(WrongWords(words, table->state["enabled"]), "");
+    }
     ++seen[table->state["windows"].empty() ? "" : table->state["windows"].back()];
     if (runs) continue;
     settled += table->model.Settled();
