@@ -1,7 +1,7 @@
 #include "shell/command_line.h"
 
+#include <cstdio>
 #include <cstdlib>
-#include <iostream>
 #include <string_view>
 
 namespace feltside {
@@ -22,11 +22,11 @@ std::optional<int> AnswerCommandLine(int argc, char** argv) {
   if (argc < 2) return std::nullopt;
   const std::string_view word = argv[1];
   if (word == "--help") {
-    std::cout << kUsage;
+    std::fputs(kUsage, stdout);
   } else if (word == "--version") {
-    std::cout << "Feltside " FELTSIDE_VERSION "\n";
+    std::puts("Feltside " FELTSIDE_VERSION);
   } else {
-    std::cerr << "feltside: no such option: " << word << "\nTry \"feltside --help\".\n";
+    std::fprintf(stderr, "feltside: no such option: %s\nTry \"feltside --help\".\n", argv[1]);
     return kExitRefused;
   }
   return EXIT_SUCCESS;

@@ -67,4 +67,21 @@ std::string ChordText(const KeyStroke& stroke) {
   return stroke.character == ' ' ? text + "Space" : text + stroke.character;
 }
 
+bool ActsWhileHeld(Key key) {
+  switch (key) {
+    case Key::kTab:
+    case Key::kBackspace:
+    case Key::kDelete:
+    case Key::kUp:
+    case Key::kDown:
+    case Key::kLeft:
+    case Key::kRight:
+    case Key::kPageUp:
+    case Key::kPageDown:
+      return true;
+    default:
+      return false;
+  }
+}
+
 }  // namespace platform

@@ -48,6 +48,10 @@ std::optional<KeyStroke> ParseChord(const std::string& text);
 /// The text that ParseChord takes for a key stroke.
 std::string ChordText(const KeyStroke& stroke);
 
+/// Whether a key that is held down goes on acting: those that move or erase do, those that would
+/// deal or play again and again do not.
+bool ActsWhileHeld(Key key);
+
 enum class InputKind {
   kPointerDown,
   kPointerMove,  ///< while the stylus is down or the mouse hovers

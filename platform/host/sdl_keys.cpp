@@ -93,21 +93,4 @@ KeyStroke StrokeOf(const SDL_Keysym& key) {
   return stroke;
 }
 
-bool ActsWhileHeld(Key key) {
-  switch (key) {
-    case Key::kTab:
-    case Key::kBackspace:
-    case Key::kDelete:
-    case Key::kUp:
-    case Key::kDown:
-    case Key::kLeft:
-    case Key::kRight:
-    case Key::kPageUp:
-    case Key::kPageDown:
-      return true;
-    default:
-      return false;
-  }
-}
-
 }  // namespace platform

@@ -1,7 +1,7 @@
 #include "platform/store/profile.h"
 
 #include <algorithm>
-#include <iostream>
+#include <cstdio>
 
 namespace platform {
 
@@ -28,7 +28,7 @@ void CProfileSection::Put(const std::string& entry, const Value& value) {
 std::vector<std::string> CProfile::TakeTroubles() { return std::exchange(m_troubles, {}); }
 
 void CProfile::Tell(const std::string& trouble) {
-  std::cerr << trouble << '\n';
+  std::fprintf(stderr, "%s\n", trouble.c_str());
   if (std::find(m_told.begin(), m_told.end(), trouble) != m_told.end()) return;
   m_told.push_back(trouble);
   m_troubles.push_back(trouble);

@@ -1,0 +1,54 @@
+// The page around the table.
+const page = (function () {
+  const voice = document.getElementById('voice');
+  const ended = document.getElementById('ended');
+  const fullScreen = document.getElementById('full_screen');
+
+  document.getElementById('again').addEventListener('click', function () { location.reload(); });
+
+  fullScreen.hidden = !document.fullscreenEnabled;
+  fullScreen.addEventListener('click', function () {
+    if (document.fullscreenElement) document.exitFullscreen();
+    else document.documentElement.requestFullscreen();
+    picture.canvas.focus({ preventScroll: true });
+  });
+
+  if ('serviceWorker' in navigator && window.isSecureContext) {
+    navigator.serviceWorker.register('worker.js').catch(function () {});  // played from the network then
+  }
+
+  let room = '';
+  function measure() {
+    const ratio = window.devicePixelRatio;
+    const place = picture.roomPlace();
+    const size = { x: Math.max(1, Math.round(place.width * ratio)), y: Math.max(1, Math.round(place.height * ratio)) };
+    const text = size.x + ' ' + size.y + ' ' + ratio;
+    if (text === room) return;
+    room = text;
+    events.push('room', size);
+  }
+  window.addEventListener('resize', measure);
+  if (window.visualViewport) window.visualViewport.addEventListener('resize', measure);
+  measure();
+  picture.canvas.focus({ preventScroll: true });
+
+  return {
+    /** Has a reader of the screen say this, also a second time. */
+    say: function (text) { voice.textContent = text === voice.textContent ? text + '\u00a0' : text; },
+
+    /** One page of help for all that is asked; false where the browser does not let it open. */
+    open: function (address) {
+      const opened = window.open(address, 'help');
+      if (opened) opened.focus();
+      return opened !== null;
+    },
+
+    end: function () {
+      if (window.matchMedia('(display-mode: standalone)').matches) window.close();
+      document.body.classList.add('has_ended');
+      ended.hidden = false;
+      document.getElementById('again').focus();
+      page.say('The game has ended');
+    },
+  };
+})();
