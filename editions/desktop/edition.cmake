@@ -1,6 +1,5 @@
 # For a desktop with the system's own libraries.
 set(FELTSIDE_SIBLINGS sdl png toml file posix)
-set(FELTSIDE_DISPLAY FELTSIDE::SDL2)
 # Only the parts in use are linked and loaded: two megabytes less in memory.
 set(FELTSIDE_LINK_OPTIONS -static-libstdc++ -static-libgcc -Wl,--gc-sections)
 # As seen from the program, so that a built package names no folder of the machine that built it.
