@@ -21,7 +21,10 @@ namespace {
   dup2(output, STDOUT_FILENO);
   dup2(errors, STDERR_FILENO);
   setenv("XDG_CONFIG_HOME", folder.Path().c_str(), 1);
-  execl(FELTSIDE_STYLUS, FELTSIDE_STYLUS, nullptr);
+  // Another edition's, where the environment names one.
+  const char* const other = std::getenv("FELTSIDE_STYLUS");
+  const char* const program = other == nullptr ? FELTSIDE_STYLUS : other;
+  execl(program, program, nullptr);
   _exit(127);
 }
 

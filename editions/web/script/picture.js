@@ -52,10 +52,10 @@ const picture = (function () {
     place: function (left, top, width, height) {
       const ratio = window.devicePixelRatio;
       place = { left: left, top: top, width: width, height: height };
-      table.style.left = left / ratio + 'px';
-      table.style.top = top / ratio + 'px';
-      table.style.width = width / ratio + 'px';
-      table.style.height = height / ratio + 'px';
+      Object.entries(place).forEach(function (side) {
+        // Browsers cut lengths down to such a part, and would miss the pixel of the display.
+        table.style[side[0]] = Math.ceil(side[1] / ratio * 64) / 64 + 'px';
+      });
       const multiple = Math.ceil(width / small.width);
       canvas.width = small.width * multiple;
       canvas.height = small.height * multiple;
