@@ -5,15 +5,25 @@
 # packages PROFILE...: the packages that are needed with these build profiles, and by the game itself.
 packages() {
   awk -v profiles=" $* " '
+    # Whether all words of a group such as "nocheck !pkg.feltside.play" hold.
+    function holds(group, words, i, count) {
+      count = split(group, words, " ")
+      for (i = 1; i <= count; i++)
+        if ((index(profiles, " " substr(words[i], 1 + (words[i] ~ /^!/)) " ") > 0) == (words[i] ~ /^!/))
+          return 0
+      return 1
+    }
     /^[^ ]/ { in_list = /^(Build-)?Depends:/ }
     in_list && /^ [^$]/ {
-      gsub(/[<>,]|\([^)]*\)/, " ")
-      for (i = 2; i <= NF; i++) {
-        name = $i
-        wanted = sub(/^!/, "", name) ? 0 : 1
-        if ((index(profiles, " " name " ") > 0) != wanted) next
+      name = $1
+      sub(/,$/, "", name)
+      count = split($0, groups, "<")
+      wanted = count == 1
+      for (i = 2; i <= count; i++) {
+        sub(/>.*/, "", groups[i])
+        if (holds(groups[i])) wanted = 1
       }
-      print $1
+      if (wanted) print name
     }' debian/control
 }
 

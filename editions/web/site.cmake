@@ -1,11 +1,22 @@
-# Lays the page's files around the program in SITE: its own, the help, the icons, the licences. The
-# version is what all of them amount to.
+# Lays the page's files around the program in SITE: its own, the help, the icons, the licences and the
+# sources. The version is what all of them amount to.
 set(page ${ROOT}/editions/web/page)
-file(COPY ${page}/feltside.css ${page}/feltside.webmanifest ${ROOT}/editions/web/icons ${ROOT}/help
-     DESTINATION ${SITE})
+file(COPY ${page}/feltside.css ${page}/feltside.webmanifest ${page}/licences.html
+     ${ROOT}/editions/web/icons ${ROOT}/help DESTINATION ${SITE})
+# What is played without a network.
+file(GLOB_RECURSE files LIST_DIRECTORIES false RELATIVE ${SITE}
+     ${SITE}/feltside.* ${SITE}/licences.html ${SITE}/icons/* ${SITE}/help/*)
 
-file(GLOB_RECURSE files LIST_DIRECTORIES false RELATIVE ${SITE} ${SITE}/*)
-list(REMOVE_ITEM files index.html worker.js)
+configure_file(${ROOT}/LICENSE ${SITE}/licences/feltside.txt COPYONLY)
+configure_file(${ROOT}/build/libraries/freetype/debian/copyright ${SITE}/licences/freetype.txt COPYONLY)
+foreach(package emscripten fonts-liberation libutfcpp-dev)
+  configure_file(/usr/share/doc/${package}/copyright ${SITE}/licences/${package}.txt COPYONLY)
+endforeach()
+execute_process(
+  COMMAND tar --create --gzip --file ${SITE}/feltside-sources.tar.gz --transform s,^\\.,feltside,
+          --exclude=./build --exclude=./.git --exclude=__pycache__ .
+  WORKING_DIRECTORY ${ROOT} COMMAND_ERROR_IS_FATAL ANY)
+
 set(sums "")
 foreach(file IN LISTS files)
   file(SHA256 ${SITE}/${file} sum)

@@ -98,12 +98,10 @@ class Page:
     def __init__(self, browser, address, *scripts, phone=False):
         self.browser = browser
         self.phone = phone
-        self.scripts = [self.cdp("Page.addScriptToEvaluateOnNewDocument", source=script)["identifier"]
-                        for script in scripts]
+        added = [self.cdp("Page.addScriptToEvaluateOnNewDocument", source=script)["identifier"]
+                 for script in scripts]
         browser.get(address)
-
-    def forget_scripts(self):
-        for identifier in self.scripts:
+        for identifier in added:
             self.cdp("Page.removeScriptToEvaluateOnNewDocument", identifier=identifier)
 
     def cdp(self, command, **values):

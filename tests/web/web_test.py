@@ -45,7 +45,6 @@ class WebTest(unittest.TestCase):
     def open(self, *scripts, told="Enter to deal"):
         page = Page(self.browser, self.server.address, *scripts, phone=self.phone)
         page.wait_for(told)
-        self.addCleanup(page.forget_scripts)
         return page
 
     def enter_a_score(self, page, type_name):
@@ -143,7 +142,7 @@ class Game:
         self.assertEqual(page.kept()["High0"], '"Zoë Ж 107')
         page.tap(self.desk.middle_of(1))
         page.wait_until(page.ended, "the end")
-        page.run("document.getElementById('again').click()")
+        page.browser.find_element("id", "again").click()
         page.wait_for("Wallet $100")
         page.tap(MENU)
         page.tap(HIGH_SCORES)
