@@ -27,6 +27,15 @@ const page = (function () {
     room = text;
     events.push('room', size);
   }
+  /** A window may come to a sharper display without becoming another size. */
+  function watchSharpness() {
+    const same = window.matchMedia('(resolution: ' + window.devicePixelRatio + 'dppx)');
+    same.addEventListener('change', function () {
+      measure();
+      watchSharpness();
+    }, { once: true });
+  }
+  watchSharpness();
   window.addEventListener('resize', measure);
   if (window.visualViewport) window.visualViewport.addEventListener('resize', measure);
   measure();
