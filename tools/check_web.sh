@@ -23,7 +23,7 @@ done
 
 bytes=0
 for file in build/web/site/feltside.{js,wasm}; do
-  bytes=$((bytes + $(brotli --quality=11 --lgwin=24 --stdout $file | wc -c)))
+  bytes=$((bytes + $(brotli --quality=11 --lgwin=24 --stdout "$file" | wc -c)))
 done
 say "script and program take $bytes bytes on the way to a browser"
 [ $bytes -lt $most_bytes ] || fail "that is more than $most_bytes"

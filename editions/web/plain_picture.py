@@ -1,9 +1,9 @@
 #!/usr/bin/env python3
 """Writes PNG pictures as pixels that need no decoder: plain_picture.py FOLDER PICTURE...
 
-A picture is its width and height, two bytes each with the lower one first; the number of its colours
-less one; the colours as blue, green, red, alpha; and the number of a colour for every pixel. A browser
-fetches these smaller than the pictures themselves, as it can squeeze them together.
+A picture is its width and height, two bytes each with the lower one first; the number of its
+colours less one; the colours as blue, green, red, alpha; and the number of a colour for every
+pixel. A browser fetches these smaller than the pictures themselves, as they are squeezed together.
 """
 
 import sys

@@ -1,13 +1,12 @@
 // The host with a window, on SDL's driver without a display: events are put in where the desktop
 // puts them, and come out at the program's door.
 
-#include "platform/host/create_host.h"
-
 #include <SDL.h>
 #include <gtest/gtest.h>
 
 #include <optional>
 
+#include "platform/host/create_host.h"
 #include "platform/host/frame_fit.h"
 
 namespace feltside::tests {

@@ -14,7 +14,8 @@ class Firefox:
     def __init__(self):
         self.profile = tempfile.TemporaryDirectory()
         self.process = subprocess.Popen(
-            ["firefox-esr", "--headless", "--no-remote", "--marionette", "--profile", self.profile.name],
+            ["firefox-esr", "--headless", "--no-remote", "--marionette", "--profile",
+             self.profile.name],
             stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
         self.socket = self.connect()
         self.number = 0

@@ -26,6 +26,21 @@ const TheirDate = Date;
 Date = class extends TheirDate {
   constructor(...given) { if (given.length) super(...given); else super('%s'); }
 };"""
+# How many timers are running, in window.timers.
+TIMERS = """
+window.timers = 0;
+const set = window.setTimeout, clear = window.clearTimeout, running = new Set();
+window.setTimeout = function (call, ...rest) {
+  const timer = set(() => { running.delete(timer); timers = running.size; call(); }, ...rest);
+  timers = running.add(timer).size;
+  return timer;
+};
+window.clearTimeout = function (timer) {
+  clear(timer);
+  running.delete(timer);
+  timers = running.size;
+};
+window.setInterval = window.requestAnimationFrame = function () { timers = Infinity; };"""
 NO_STORAGE = """
 Object.defineProperty(window, 'localStorage', {
   get() { throw new DOMException('not here', 'SecurityError'); }
@@ -58,7 +73,7 @@ class Stylus:
     def __init__(self, folder):
         self.folder = Path(folder)
         self.process = subprocess.Popen(
-            [__import__("os").environ.get("STY") or ROOT / "build/check/feltside-stylus"], stdin=subprocess.PIPE, stdout=subprocess.PIPE,
+            [ROOT / "build/check/feltside-stylus"], stdin=subprocess.PIPE, stdout=subprocess.PIPE,
             text=True, env={"XDG_CONFIG_HOME": str(folder)})
 
     def send(self, line):
@@ -98,6 +113,7 @@ class Page:
     def __init__(self, browser, address, *scripts, phone=False):
         self.browser = browser
         self.phone = phone
+        self.complaints()  # those about earlier pages
         added = [self.cdp("Page.addScriptToEvaluateOnNewDocument", source=script)["identifier"]
                  for script in scripts]
         browser.get(address)
@@ -111,6 +127,11 @@ class Page:
         self.cdp("Emulation.setDeviceMetricsOverride", width=width, height=height,
                  deviceScaleFactor=sharpness, mobile=self.phone)
         self.wait_until(lambda: self.run("return innerWidth") == width, "the other size")
+
+    def cover_below(self, height):
+        """Brings up a keyboard that leaves so much of the page in sight."""
+        self.run(f"Object.defineProperty(visualViewport, 'height', {{value: {height}}});"
+                 "visualViewport.dispatchEvent(new Event('resize'))")
 
     def run(self, script):
         return self.browser.execute_script(script)

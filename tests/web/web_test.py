@@ -6,7 +6,7 @@ import unittest
 from pathlib import Path
 
 from firefox import play_a_hand
-from page import FIXED_CLOCK, NO_STORAGE, ROOT, SITE, Page, Server, Stylus, open_browser
+from page import FIXED_CLOCK, NO_STORAGE, SITE, TIMERS, Page, Server, Stylus, open_browser
 from PIL import Image
 from selenium.webdriver.common.keys import Keys
 
@@ -86,12 +86,13 @@ class Game:
             page.wait_for("Enter to deal")
 
     def test_shows_and_tells_what_the_desktop_does(self):
-        page = self.open()
+        page = self.open(TIMERS)
         page.be_of_size(*self.whole, self.sharpness)
         page.wait_until(lambda: page.place()[2] * self.sharpness % 240 == 0, "a whole multiple")
         self.assert_shows(page, self.desk.shot())
         words = self.deal_plain(page)
-        cards = sorted((words.find(name), number) for name, number in CARDS.items() if name in words)
+        cards = sorted((words.find(name), number) for name, number in CARDS.items()
+                       if name in words)
         player, other, dealer = (number for _, number in cards)
         wallet = words.split("Wallet $")[1].split(". ")[0]
         self.desk.send(f"wallet {wallet}")
@@ -99,6 +100,8 @@ class Game:
         self.desk.send("command deal")
         self.assertEqual(self.desk.send("words")["words"], words)
         self.assert_shows(page, self.desk.shot())
+        page.wait_until(lambda: page.run("return timers") == 0, "the last timer's end")
+        self.assertEqual(page.complaints(), [])
 
     def test_keeps_settings_and_plays_the_other_game(self):
         page = self.open()
@@ -182,8 +185,10 @@ class OnPhone(Game, WebTest):
     sharpness = 3
 
     def type_name(self, page):
-        """As a phone's keyboard: letters being composed, a word corrected."""
+        """As a phone's keyboard: it covers the page, composes letters and corrects a word."""
         self.assertTrue(page.run("return document.activeElement.id === 'field'"))
+        page.cover_below(480)
+        page.wait_until(lambda: page.place()[1] + page.place()[3] <= 480, "room for the keyboard")
         for text in ("Z", "Zo", "Zoe"):
             page.cdp("Input.imeSetComposition", text=text, selectionStart=len(text),
                      selectionEnd=len(text))
