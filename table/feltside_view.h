@@ -167,6 +167,7 @@ class CFeltsideView : public platform::CView {
 
   platform::Phrases Words() const override;
   platform::Phrases BlackjackWords() const;
+  void AddPlayerHands(platform::Phrases& words) const;
   /// What the lamp says of the last move.
   std::string VerdictWords() const;
   /// What is to be known for the next step, and which keys take it.

@@ -75,13 +75,7 @@ Phrases CFeltsideView::Words() const {
 
 Phrases CFeltsideView::BlackjackWords() const {
   Phrases words;
-  if (IsSplit()) {
-    AddHand(words, "Left hand: " + FirstTwo(m_handPlayer), "Left hand draws ", m_handPlayer, "");
-    AddHand(words, "Right hand: " + FirstTwo(m_handSplit), "Right hand draws ", m_handSplit, "");
-  } else {
-    AddHand(words, "You have " + FirstTwo(m_handPlayer), "You draw ", m_handPlayer,
-            m_strPlayerScore);
-  }
+  AddPlayerHands(words);
   if (m_handDealer.GetCount() > 0) words.push_back("The dealer shows " + The(UpCard()));
   if (m_bInsuranceTaken != 0) words.emplace_back("Insurance taken");
   if (m_bHandInProgress == 0) {
@@ -95,6 +89,16 @@ Phrases CFeltsideView::BlackjackWords() const {
   words.push_back("Wallet " + Spoken(m_dWallet));
   words.push_back(BlackjackChoices());
   return words;
+}
+
+void CFeltsideView::AddPlayerHands(Phrases& words) const {
+  if (IsSplit()) {
+    AddHand(words, "Left hand: " + FirstTwo(m_handPlayer), "Left hand draws ", m_handPlayer, "");
+    AddHand(words, "Right hand: " + FirstTwo(m_handSplit), "Right hand draws ", m_handSplit, "");
+  } else {
+    AddHand(words, "You have " + FirstTwo(m_handPlayer), "You draw ", m_handPlayer,
+            m_strPlayerScore);
+  }
 }
 
 std::string CFeltsideView::VerdictWords() const {

@@ -15,7 +15,7 @@ constexpr int kMargin = 3;  ///< above and below the channel
 }  // namespace
 
 std::string CSlider::Words(const std::string& label) const {
-  return label + " slider, " + std::to_string(m_nPos);
+  return label + " slider at " + std::to_string(m_nPos);
 }
 
 void CSlider::SetRange(int lowest, int highest) {

@@ -5,6 +5,7 @@
 
 #include "platform/host/help_opener.h"
 #include "platform/host/help_viewer.h"
+#include "platform/host/utf8_path.h"
 
 namespace platform {
 namespace {
@@ -14,7 +15,7 @@ namespace fs = std::filesystem;
 /// A path that, where it is a relative one, lies beside the program.
 fs::path ProgramPath(const fs::path& path) {
   char* base = SDL_GetBasePath();
-  const fs::path program = base == nullptr ? "." : base;
+  const fs::path program = FromUtf8(base == nullptr ? "." : base);
   SDL_free(base);
   return (program / path).lexically_normal();
 }
@@ -53,9 +54,9 @@ std::string StartHelpViewer(const std::vector<fs::path>& folders, const std::str
   const fs::path page = HelpPage(folders, commandLine);
   std::string trouble;
   if (page.empty()) {
-    trouble = "The help pages are not in " + ProgramPath(folders.front()).string() + ".";
+    trouble = "The help pages are not in " + ToUtf8(ProgramPath(folders.front())) + ".";
   } else if (!OpenInBrowser(page, milliseconds)) {
-    trouble = "The help cannot be shown in a browser; it lies in " + page.string() + ".";
+    trouble = "The help cannot be shown in a browser; it lies in " + ToUtf8(page) + ".";
   }
   if (!trouble.empty()) std::cerr << trouble << '\n';
   return trouble;

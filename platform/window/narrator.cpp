@@ -13,7 +13,7 @@ namespace {
 Phrases NewIn(const Phrases& now, const Phrases& before) {
   Phrases fresh;
   std::copy_if(now.begin(), now.end(), std::back_inserter(fresh), [&](const std::string& phrase) {
-    return std::find(before.begin(), before.end(), phrase) == before.end();
+    return !phrase.empty() && std::find(before.begin(), before.end(), phrase) == before.end();
   });
   return fresh;
 }
@@ -39,7 +39,7 @@ void CNarrator::TellOf(const CTopWindow& window) {
     const std::string sentence = Sentence(phrase);
     text += (text.empty() || sentence.empty() ? "" : " ") + sentence;
   }
-  if (!text.empty()) TheHost().Say(text);
+  TheHost().Say(text);
 }
 
 }  // namespace platform

@@ -11,8 +11,8 @@ class CTopWindow;
 /// empty one tells nothing.
 using Phrases = std::vector<std::string>;
 
-/// Tells the topmost window to a person who does not see it, by the host's voice, as far as
-/// it was not told before. The last of its phrases closes whatever is told.
+/// Tells the topmost window to a person who does not see it, by the host's voice, as far as it was
+/// not told before. The last of its phrases closes whatever is told.
 class CNarrator {
  public:
   /// Says nothing where nothing is new.

@@ -14,14 +14,11 @@ CTopWindow::CTopWindow(std::string title, const Rect& place, Kind kind)
 
 CTopWindow::~CTopWindow() { Close(); }
 
-void CTopWindow::Open() {
-  TheApp().Screen().Push(*this);
-  TheApp().TellAnew();
-}
+void CTopWindow::Open() { TheApp().Screen().Push(*this); }
 
 void CTopWindow::Close() {
   TheApp().Screen().Remove(*this);
-  TheApp().TellAnew();
+  TheApp().TellAnew();  // whoever comes back to a window may have forgotten it
 }
 
 void CTopWindow::PaintIfNeeded() {

@@ -166,16 +166,20 @@ bool PlayOn(Table& table, const std::string& command) {
   return answer["running"];
 }
 
-/// Whatever is said ends with what may be done by then.
-std::string WrongWords(const std::string& words, const Json& enabled) {
-  for (const auto& [command, phrase] :
-       std::map<std::string, std::string>{{"hit", "H to hit"},
-                                          {"stand", "S to stand"},
-                                          {"double", "D to double down"},
-                                          {"split", "P to split"},
-                                          {"deal", "Enter to deal"}}) {
-    const bool said = words.find(phrase) != std::string::npos;
-    if (said != enabled[std::to_string(ToCommand(command))]) return command + ": " + words;
+/// Whatever is said ends with what may be done by then. Answers what is said or missing wrongly.
+std::string WrongWords(const std::string& words, const Json& state) {
+  const auto may = [&state](const char* command) -> bool {
+    return state["enabled"][std::to_string(ToCommand(command))];
+  };
+  for (const auto& [phrase, expected] : std::vector<std::pair<std::string, bool>>{
+           {"H to hit", may("hit")},
+           {"S to stand", may("stand")},
+           {"D to double down", may("double")},
+           {"P to split", may("split")},
+           {"I to take it", state["m_bInsuranceOffered"] == 1},
+           {"Enter to play", state["m_bDrawPending"] == 1},
+           {"Enter to deal", may("deal")}}) {
+    if ((words.find(phrase) != std::string::npos) != expected) return phrase;
   }
   return {};
 }
@@ -208,7 +212,7 @@ TEST_P(RandomPlay, KeepsTheTableInOrder) {
     const bool runs = table->state["running"] && PlayOn(*table, command);
     if (runs && i % kListenEvery == 0 && table->state["windows"].size() == 1) {
       const std::string words = table->stylus.Send("words")["words"];
-      EXPECT_EQ(WrongWords(words, table->state["enabled"]), "");
+      EXPECT_EQ(WrongWords(words, table->state), "") << words;
     }
     ++seen[table->state["windows"].empty() ? "" : table->state["windows"].back()];
     if (runs) continue;
