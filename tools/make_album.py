@@ -16,6 +16,14 @@ from pathlib import Path
 from scenes import ROOT, SCALE, indexed, open_stylus, read_scenes, save, take
 
 ALBUM = ROOT / "docs" / "album"
+# Taken by tests/web/take_pictures.py.
+BROWSER = {
+    "desktop": "In a browser on a desktop.",
+    "phone": "On a phone.",
+    "phone_lying": "On a phone that lies.",
+    "phone_typing": "A name is typed: the keyboard lies below the picture.",
+    "ended": "After Exit.",
+}
 
 # What is left of red, green and blue (linear) where one kind of cone is missing. The figures are
 # those for severity 1.0 in G. M. Machado, M. M. Oliveira, L. A. F. Fernandes: A Physiologically-
@@ -39,6 +47,7 @@ body { margin: 2em auto; max-width: 78em; padding: 0 1em; font: 16px/1.45 sans-s
 section { display: flex; flex-wrap: wrap; gap: 1.5em; }
 figure { margin: 0; width: 480px; }
 img { display: block; image-rendering: pixelated; }
+figure.page img { max-width: 100%; max-height: 588px; image-rendering: auto; }
 figcaption { margin-top: 0.3em; }
 @media (max-width: 520px) { figure, img { width: 100%; height: auto; } }
 """
@@ -75,6 +84,11 @@ def figure(scene, size):
             f"<figcaption>{text}</figcaption></figure>")
 
 
+def browser_figure(name):
+    return (f'<figure class="page"><img src="browser/{name}.png" alt="">'
+            f"<figcaption>{BROWSER[name]}</figcaption></figure>")
+
+
 def write_page(folder, figures, vision):
     title = "Feltside: every screen" + (f", seen with {vision}" if vision else "")
     lines = ["<!DOCTYPE html>", '<html lang="en">', '<meta charset="utf-8">',
@@ -82,6 +96,9 @@ def write_page(folder, figures, vision):
              f"<style>\n{STYLE}</style>", f"<h1>{title}</h1>"]
     for heading, below in figures.items():
         lines += [f"<h2>{heading}</h2>", "<section>", *below, "</section>"]
+    if folder == ALBUM:
+        lines += ["<h2>On a page of a browser</h2>", "<section>", *map(browser_figure, BROWSER),
+                  "</section>"]
     (folder / "index.html").write_text("\n".join(lines) + "\n")
 
 

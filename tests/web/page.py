@@ -126,7 +126,12 @@ class Page:
     def be_of_size(self, width, height, sharpness):
         self.cdp("Emulation.setDeviceMetricsOverride", width=width, height=height,
                  deviceScaleFactor=sharpness, mobile=self.phone)
-        self.wait_until(lambda: self.run("return innerWidth") == width, "the other size")
+        # The picture is then drawn at the next whole multiple of its size.
+        self.wait_until(lambda: self.run(
+            "const shown = document.getElementById('picture');"
+            "const across = shown.getBoundingClientRect().width * devicePixelRatio;"
+            f"return innerWidth === {width} && devicePixelRatio === {sharpness} &&"
+            "  shown.width === Math.ceil(Math.round(across) / 240) * 240"), "the other size")
 
     def cover_below(self, height):
         """Brings up a keyboard that leaves so much of the page in sight."""
@@ -135,6 +140,14 @@ class Page:
 
     def run(self, script):
         return self.browser.execute_script(script)
+
+    def worker(self, what):
+        """What there is to say of the worker's registration `r`."""
+        return self.run(f"return navigator.serviceWorker.getRegistration().then(r => {what})")
+
+    def wait_until_kept(self):
+        """Waits until the whole game is kept for the time without a network."""
+        self.run("return navigator.serviceWorker.ready.then(() => 0)")
 
     def words(self):
         """What was told last to a reader of the screen."""

@@ -154,7 +154,7 @@ class Game:
 
     def test_opens_the_help_and_goes_on_without_a_network(self):
         page = self.open()
-        page.run("return navigator.serviceWorker.ready.then(() => 0)")
+        page.wait_until_kept()
         self.server.close()
         page = self.open()
         page.tap(MENU)
@@ -242,18 +242,17 @@ class Store(WebTest):
         self.server.close()
         self.server = Server(site)
         page = self.open()
-        page.run("return navigator.serviceWorker.ready.then(() => 0)")
-        version = page.run("return fetch('worker.js').then(a => a.text())").split("VERSION = '")[1][:12]
-        for name in ("index.html", "worker.js"):
-            file = site / name
-            file.write_text(file.read_text().replace(version, "newer0000000"))
+        page.wait_until_kept()
 
         def shown():
             return page.run("return document.querySelector('script[src]').src").split("?")[1]
+        version = shown()
+        for name in ("index.html", "worker.js"):
+            file = site / name
+            file.write_text(file.read_text().replace(version, "newer0000000"))
         page = self.open()
-        page.run("return navigator.serviceWorker.getRegistration().then(r => r.update()).then(() => 0)")
-        page.wait_until(lambda: page.run("return navigator.serviceWorker.getRegistration()"
-                                         ".then(r => r.waiting !== null)"), "the newer version")
+        page.worker("r.update().then(() => 0)")
+        page.wait_until(lambda: page.worker("r.waiting !== null"), "the newer version")
         page = self.open()
         self.assertEqual(shown(), version)
         self.browser.get("about:blank")
