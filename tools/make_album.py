@@ -20,7 +20,7 @@ ALBUM = ROOT / "docs" / "album"
 BROWSER = {
     "desktop": "In a browser on a desktop.",
     "phone": "On a phone.",
-    "phone_lying": "On a phone that lies.",
+    "phone_lying": "On a phone on its side.",
     "phone_typing": "A name is typed: the keyboard lies below the picture.",
     "ended": "After Exit.",
 }
