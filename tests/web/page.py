@@ -41,6 +41,14 @@ window.clearTimeout = function (timer) {
   timers = running.size;
 };
 window.setInterval = window.requestAnimationFrame = function () { timers = Infinity; };"""
+# The sixth value finds no room.
+LITTLE_STORAGE = """
+const put = Storage.prototype.setItem;
+let stored = 0;
+Storage.prototype.setItem = function (name, value) {
+  if (++stored === 6) throw new DOMException('full', 'QuotaExceededError');
+  put.call(this, name, value);
+};"""
 NO_STORAGE = """
 Object.defineProperty(window, 'localStorage', {
   get() { throw new DOMException('not here', 'SecurityError'); }

@@ -6,7 +6,8 @@ import unittest
 from pathlib import Path
 
 from firefox import play_a_hand
-from page import FIXED_CLOCK, NO_STORAGE, SITE, TIMERS, Page, Server, Stylus, open_browser
+from page import (FIXED_CLOCK, LITTLE_STORAGE, NO_STORAGE, SITE, TIMERS, Page, Server, Stylus,
+                  open_browser)
 from PIL import Image
 from selenium.webdriver.common.keys import Keys
 
@@ -223,6 +224,21 @@ class Store(WebTest):
         page.keys(Keys.DOWN, Keys.ENTER)
         self.assertNotIn("keeps", page.wait_for("You hold all"))
 
+    def test_keeps_all_of_a_dialog_or_nothing(self):
+        self.desk.send("command table-setup")
+        kept = []
+        for scripts, told in (((), "Enter to deal"), ((LITTLE_STORAGE,), "has no room left")):
+            page = self.open(*scripts)
+            page.tap(MENU)
+            page.tap(TABLE_SETUP)
+            page.wait_for("Setup Table")
+            for number in (1012, 1014, 1010, 1013, 1):
+                page.tap(self.desk.middle_of(number))
+            page.wait_for(told)
+            kept.append(page.kept())
+        self.assertEqual(kept[0]["USEHIGH"], "0")
+        self.assertEqual(kept[1], kept[0])
+
     def test_keeps_the_scores_of_two_games(self):
         first = self.open(FIXED_CLOCK % NATURAL)
         handle = self.browser.current_window_handle
@@ -255,6 +271,7 @@ class Store(WebTest):
         page.wait_until(lambda: page.worker("r.waiting !== null"), "the newer version")
         page = self.open()
         self.assertEqual(shown(), version)
+        self.assertTrue(page.worker("r.waiting !== null"))
         self.browser.get("about:blank")
         page.wait_until(lambda: self.open() and shown() != version, "the change")
         self.assertEqual(shown(), "newer0000000")
