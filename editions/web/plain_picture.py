@@ -2,14 +2,25 @@
 """Writes PNG pictures as pixels that need no decoder: plain_picture.py FOLDER PICTURE...
 
 A picture is its width and height, two bytes each with the lower one first; the number of its
-colours less one; the colours as blue, green, red, alpha; and the number of a colour for every
-pixel. A browser fetches these smaller than the pictures themselves, as they are squeezed together.
+colours less one; the colours as blue, green, red, alpha; and from the top left the number of pixels
+alike, at most 255, and of their colour, again and again. A browser fetches these smaller than the
+pictures themselves, as they are squeezed together.
 """
 
 import sys
+from itertools import groupby
 from pathlib import Path
 
 from PIL import Image
+
+
+def runs(numbers):
+    """(how many alike, number) from the first to the last."""
+    for number, alike in groupby(numbers):
+        count = len(list(alike))
+        while count > 0:
+            yield min(count, 255), number
+            count -= 255
 
 
 def plain(picture):
@@ -20,7 +31,7 @@ def plain(picture):
     return (picture.width.to_bytes(2, "little") + picture.height.to_bytes(2, "little")
             + bytes([len(colours) - 1])
             + bytes(colour[part] for colour in colours for part in (blue, green, red, alpha))
-            + bytes(numbers[pixel] for pixel in pixels))
+            + b"".join(map(bytes, runs(numbers[pixel] for pixel in pixels))))
 
 
 def main():

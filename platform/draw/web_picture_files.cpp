@@ -1,5 +1,6 @@
 // Pictures that the web edition's plain_picture.py has laid out: a page needs no decoder for them.
 
+#include <algorithm>
 #include <array>
 
 #include "platform/draw/resources.h"
@@ -21,7 +22,10 @@ std::optional<CBitmap> DecodePicture(const EmbeddedFile& file) {
     for (unsigned shift = 0; shift < 32; shift += 8) colors[i] |= next() << shift;
   }
   CBitmap bitmap({width, height});
-  for (Pixel* pixel = bitmap.Data(); at != file.data + file.size; ++pixel) *pixel = colors[next()];
+  for (Pixel* pixel = bitmap.Data(); at != file.data + file.size;) {
+    const unsigned alike = next();
+    pixel = std::fill_n(pixel, alike, colors[next()]);
+  }
   return bitmap;
 }
 
