@@ -2,10 +2,9 @@
 """Takes the album's pictures of the page, to be looked at: take_pictures.py"""
 
 from page import FIXED_CLOCK, ROOT, Page, Server, open_browser
-from web_test import DEAL, EXIT, MENU, NATURAL, STAND
+from web_test import DEAL, EXIT, MENU, NATURAL, PLAIN, STAND
 
 FOLDER = ROOT / "docs" / "album" / "browser"
-PLAIN = "2000-01-01T12:00:09"  # a time at which the first deal is to be played
 
 
 def save(page, name):
