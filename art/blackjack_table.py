@@ -26,15 +26,13 @@ _TEXT_BLANK = 2.6
 _TEXT_STROKE = 0.58
 
 _MEDALLION = (180, 118)
-# Dealer and player each have the whole end of the table behind a line as their field: cards, names
-# and totals lie on it, those of one hand and those of two.
-_DEALERS_LINE, _PLAYERS_LINE = 195, 321
-_FIELD_INK, _CLOTH_INK = 4, 8
-_NOTCH = 10
+_PLAYERS_LINE = 321
+_CLOTH_INK = 8
 _INSIDE_FRAME = 6
-# In each field a row of suits, above the player's totals and below the dealer's.
-_SUIT_ROWS = (38, 230)
-_SUITS_IN_ROW, _SUIT_STEP = 8, 15
+_NOTCH = 17
+# The dealer's cards lie in a tray. The player's may be one hand or two, and their totals lie beside
+# them: all of that has room in one place.
+_DEALERS_TRAY, _PLAYERS_PLACE = (77, 8, 146, 53), (10, 212, 230, 260)
 
 
 class Paper:
@@ -76,13 +74,18 @@ def _arc(inner, outer):
 
 
 def _notched(inset):
-    """The whole picture less an inset, a quarter circle cut out of each corner.
-
-    The circles are small, as the total of the right hand of a split stands beside the lower one.
-    """
+    """The whole picture less an inset, a quarter circle cut out of each upper corner."""
     def inside(x, y):
         dx, dy = min(x, WIDTH - x), min(y, HEIGHT - y)
-        return min(dx, dy) >= inset and math.hypot(dx, dy) >= _NOTCH + inset
+        return min(dx, dy) >= inset and math.hypot(dx, y) >= _NOTCH + inset
+    return inside
+
+
+def _rounded(left, top, right, bottom, radius):
+    def inside(x, y):
+        dx = max(left + radius - x, x - right + radius, 0)
+        dy = max(top + radius - y, y - bottom + radius, 0)
+        return math.hypot(dx, dy) < radius
     return inside
 
 
@@ -120,7 +123,7 @@ def _bare(x, y):
     radius = _arc_radius(x, y)
     if radius < 231 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
         return False
-    return 14 < x < WIDTH - 14 and y < _SUIT_ROWS[1] - 12
+    return 14 < x < WIDTH - 14 and y < _PLAYERS_PLACE[1] - 8
 
 
 def _lay_cloth(paper):
@@ -147,22 +150,24 @@ def _lay_medallion(paper):
     paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
 
 
-def _lay_fields(paper):
-    inside = _notched(_INSIDE_FRAME)
-    paper.lay(lambda x, y: inside(x, y) and not _DEALERS_LINE <= _arc_radius(x, y) < _PLAYERS_LINE,
-              _FIELD_INK)
-    for y in _SUIT_ROWS:
-        for place in range(_SUITS_IN_ROW):
-            x = WIDTH / 2 + _SUIT_STEP * (place - (_SUITS_IN_ROW - 1) / 2)
-            paper.lay_placed(shapes.SUITS[place % 4], x, y, 6, 16)
+def _lay_place(paper, place):
+    left, top, right, bottom = place
+    paper.lay(_outline(_rounded(left, top, right, bottom, 4),
+                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)), INK_LIMIT,
+              (left - 1, top - 1, right + 1, bottom + 1))
+
+
+def _lay_suits(paper, x, y, step):
+    """A row of the four suits about a point."""
+    for place, suit in enumerate(shapes.SUITS):
+        paper.lay_placed(suit, x + step * (place - 1.5), y, 6, 16)
 
 
 def _lay_frame(paper):
     paper.lay(_outline(_notched(2), _notched(3)), INK_LIMIT)
     paper.lay(_outline(_notched(5), _notched(_INSIDE_FRAME)), 18)
-    for suit, x, y in ((shapes.spade, 6, 6), (shapes.heart, WIDTH - 6, 6),
-                       (shapes.diamond, 6, HEIGHT - 6), (shapes.club, WIDTH - 6, HEIGHT - 6)):
-        paper.lay_placed(suit, x, y, 4.5, 24)
+    for suit, x in ((shapes.spade, 8), (shapes.heart, WIDTH - 8)):
+        paper.lay_placed(suit, x, 8, 6, 24)
 
 
 def blackjack_table():
@@ -174,7 +179,10 @@ def blackjack_table():
         paper.lay(_arc(inner, outer), ink)
     _lay_inscription(paper)
     _lay_medallion(paper)
-    _lay_fields(paper)
+    for place in (_DEALERS_TRAY, _PLAYERS_PLACE):
+        _lay_place(paper, place)
+    left, top, right, bottom = _DEALERS_TRAY
+    _lay_suits(paper, (left + right) / 2, (top + bottom) / 2, 15)
     _lay_frame(paper)
     return paper.canvas()
 

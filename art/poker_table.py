@@ -17,11 +17,11 @@ SEEN_HEIGHT = 268
 
 # Where the game puts things: left, top, right, bottom.
 BUTTON = (70, 180, 155, 215)
-# The panels reach from one side post to the other, as the longest result ends eight columns before
-# the right edge of the picture. LEFT and RIGHT are those of what is inside their frames.
-LEFT, RIGHT = 3, WIDTH - 3
-WALLET = (LEFT, 230, 116, 254)
-RESULT = (WIDTH - 116, 230, RIGHT, 254)
+# The longest result ends eight columns before the right edge of the picture: the two displays stand
+# on a strip that goes from side to side, below the cabinet's frame.
+STRIP_TOP = 219
+WALLET = (4, 230, 115, 254)
+RESULT = (WIDTH - 115, 230, WIDTH - 4, 254)
 CARDS = [(x, 114, x + 29, 155) for x in (40, 73, 106, 139, 172)]
 
 PAYS = (
@@ -50,8 +50,9 @@ def grown(box, by):
 
 
 def sunk_panel(picture, box, face):
-    """A flat panel let into the cabinet, its frame one pixel wide around the box."""
-    bevel(picture, grown(box, 1), night(0), night(12))
+    """A flat panel let into the cabinet, its frame two pixels wide around the box."""
+    bevel(picture, grown(box, 2), night(3), night(12))
+    bevel(picture, grown(box, 1), night(0), night(9))
     picture.rect(*box, face)
 
 
@@ -71,13 +72,22 @@ _MIX = ((0, 8, 2, 10), (12, 4, 14, 6), (3, 11, 1, 9), (15, 7, 13, 5))
 
 def cabinet(picture):
     """The body, lit from above, and the desk that carries the button and the panels."""
-    shaded(picture, (0, 0, WIDTH, HEIGHT), 8, 4)
-    for inset, light, dark in ((0, 14, 2), (1, 11, 3)):
-        bevel(picture, (inset, inset, WIDTH - inset, SEEN_HEIGHT - inset),
-              night(light), night(dark))
-    shaded(picture, (2, 167, WIDTH - 2, SEEN_HEIGHT - 2), 9, 6)
-    picture.rect(2, 165, WIDTH - 2, 166, night(2))
-    picture.rect(2, 166, WIDTH - 2, 167, night(14))
+    shaded(picture, (0, 0, WIDTH, STRIP_TOP), 8, 4)
+    for inset, light, dark in ((0, 14, 2), (1, 11, 3), (2, 3, 9)):
+        bevel(picture, (inset, inset, WIDTH - inset, STRIP_TOP - inset), night(light), night(dark))
+    shaded(picture, (3, 167, WIDTH - 3, STRIP_TOP - 3), 9, 6)
+    picture.rect(3, 165, WIDTH - 3, 166, night(2))
+    picture.rect(3, 166, WIDTH - 3, 167, night(14))
+
+
+def strip(picture):
+    """The front edge below the desk, with the two displays."""
+    shaded(picture, (0, STRIP_TOP, WIDTH, HEIGHT), 5, 3)
+    bevel(picture, (0, STRIP_TOP, WIDTH, SEEN_HEIGHT), night(12), night(1))
+    for box, label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
+        bevel(picture, grown(box, 1), night(0), night(12))
+        picture.rect(*box, "cell_blue" if label == "WALLET" else "cell_slate")
+        TINY.write(picture, box[0], box[1] - 8, label, night(18))
 
 
 def soft_suit(picture, shape, x, y, half_height, ramp):
@@ -100,12 +110,12 @@ def bulb(picture, x, y, lit):
 
 
 def marquee(picture):
-    box = (LEFT, 7, RIGHT, 37)
+    box = (9, 8, 231, 37)
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
-    for place in range(29):
-        for y in (top + 1, bottom - 4):
-            bulb(picture, left + 4 + 8 * place, y, (place + (y > 20)) % 2 == 0)
+    for place in range(28):
+        for y in (top, bottom - 3):
+            bulb(picture, left + 2 + 8 * place, y, (place + (y > 20)) % 2 == 0)
     BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
     BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
     nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
@@ -113,7 +123,7 @@ def marquee(picture):
 
 
 def pay_table(picture):
-    box = (LEFT, 42, RIGHT, 105)
+    box = (9, 42, 231, 105)
     sunk_panel(picture, box, night(3))
     left, top, right, _ = box
     middle, pitch = (left + right) // 2, 16
@@ -124,8 +134,8 @@ def pay_table(picture):
         if row % 2:
             picture.rect(x, y - 1, x + half, y + pitch - 1, night(2))
         best = place == 0
-        PLAIN.write(picture, x + 8, y + 4, name, "gold_light" if best else night(19))
-        BOLD.write_right(picture, x + half - 8, y + 4, pays, "gold_light")
+        PLAIN.write(picture, x + 7, y + 4, name, "gold_light" if best else night(19))
+        BOLD.write_right(picture, x + half - 7, y + 4, pays, "gold_light")
     picture.rect(middle - 1, top, middle, top + 63, night(0))
     picture.rect(middle, top, middle + 1, top + 63, night(7))
 
@@ -167,11 +177,6 @@ def _small_card(picture, x, y, face, edge):
     picture.rect(x + 2, y + 2, x + 8, y + 12, face)
 
 
-def displays(picture):
-    sunk_panel(picture, WALLET, "cell_blue")
-    sunk_panel(picture, RESULT, "cell_slate")
-
-
 def desk(picture):
     """What stands about the button: the player's chips, and the slot for the dollar."""
     for x, y in ((12, 198), (36, 202)):
@@ -190,11 +195,6 @@ def desk(picture):
     TINY.write_centred(picture, 192, 228, 200, "A DEAL", night(18))
 
 
-def labels(picture):
-    for (left, top, _, _), label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
-        TINY.write(picture, left + 5, top - 9, label, night(18))
-
-
 def poker_table():
     picture = Canvas(WIDTH, HEIGHT, night(2))
     cabinet(picture)
@@ -203,8 +203,7 @@ def poker_table():
     card_bay(picture)
     desk(picture)
     button(picture)
-    displays(picture)
-    labels(picture)
+    strip(picture)
     return picture
 
 

@@ -16,8 +16,8 @@ _FELT = (48, 83.5, 40, 21)
 _RAIL = 6
 _RAIL_DEPTH = 4
 
-_CARD_WIDTH, _CARD_HEIGHT = 34, 48
-_LEAN = 7
+_CARD_WIDTH, _CARD_HEIGHT = 34, 44
+_LEAN = 4
 _SIGNS = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "title.txt")
 
 
@@ -59,58 +59,79 @@ def felt_colour(dx, dy):
 class LeaningCard:
     """A large card that leans by a pixel in so many, to the left (below 0) or to the right.
 
-    Its edges lean in even steps; what is drawn on it stands upright, as a sign of few pixels would
-    be torn by the steps.
+    Rows and then columns are moved on by whole pixels, so that every edge is an even stair. A sign
+    of few pixels would be torn by moved columns: only its rows are moved.
     """
 
     def __init__(self, lean):
-        self._lean = lean
-        self._width = _CARD_WIDTH + (_CARD_HEIGHT - 1) // abs(lean)
-        self.canvas = Canvas(self._width, _CARD_HEIGHT + (self._width - 1) // abs(lean), "nothing")
-        card = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "ink")
-        card.rect(1, 1, _CARD_WIDTH - 1, _CARD_HEIGHT - 1, "white")
-        for x in (0, _CARD_WIDTH - 1):
-            for y in (0, _CARD_HEIGHT - 1):
-                card.put(x, y, "nothing")
-        self._lay(card)
+        self._right, self._step = lean > 0, abs(lean)
+        self._width = _CARD_WIDTH + (_CARD_HEIGHT - 1) // self._step
+        self.canvas = Canvas(self._width, _CARD_HEIGHT + (self._width - 1) // self._step, "nothing")
 
-    def _lay(self, flat):
-        """Lays an upright card, its rows and then its columns moved on."""
-        right, step = self._lean > 0, abs(self._lean)
+    def _shift(self, y):
+        """How far a row is moved to the right."""
+        return (_CARD_HEIGHT - 1 - y if self._right else y) // self._step
+
+    def _place(self, x, y):
+        """Where a pixel of the upright card comes to lie."""
+        column = x + self._shift(y)
+        return column, y + (column if self._right else self._width - 1 - column) // self._step
+
+    def lay(self, flat):
+        """Lays an upright card; all but where it is "nothing"."""
         for y in range(flat.height):
             for x in range(flat.width):
-                column = x + (_CARD_HEIGHT - 1 - y if right else y) // step
-                row = y + (column if right else self._width - 1 - column) // step
                 if flat.get(x, y) != "nothing":
-                    self.canvas.put(column, row, flat.get(x, y))
+                    self.canvas.put(*self._place(x, y), flat.get(x, y))
 
-    def sign_corners(self, places, colour):
-        """Sets signs, and the same upside down."""
+    def _sign(self, canvas, x, y, name, colour):
+        rows = _SIGNS[name]
+        _, top = self._place(x + len(rows[0]) // 2, y)
+        for step, row in enumerate(rows):
+            canvas.text_grid(x + self._shift(y + step), top + step, [row], {"#": colour})
+
+    def sign(self, x, y, name, colour):
+        """Sets a sign whose top-left corner is this pixel of the upright card."""
+        self._sign(self.canvas, x, y, name, colour)
+
+    def sign_corners(self, letter, suit, colour):
+        """Sets a rank and a suit, and the same upside down."""
         corner = Canvas(self.canvas.width, self.canvas.height, "nothing")
-        for x, y, name in places:
-            corner.text_grid(x, y, _SIGNS[name], {"#": colour})
+        self._sign(corner, 3, 3, letter, colour)
+        self._sign(corner, 3, 13, suit, colour)
         self.canvas.blit(corner, 0, 0, "nothing")
         self.canvas.blit(corner.rotated180(), 0, 0, "nothing")
 
 
+def blank_card():
+    card = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "ink")
+    card.rect(1, 1, _CARD_WIDTH - 1, _CARD_HEIGHT - 1, "white")
+    for x in (0, _CARD_WIDTH - 1):
+        for y in (0, _CARD_HEIGHT - 1):
+            card.put(x, y, "nothing")
+    return card
+
+
 def ace_of_spades():
     card = LeaningCard(_LEAN)
-    card.canvas.text_grid(12, 18, _SIGNS["spade"], {"#": "ink"})
-    card.sign_corners(((8, 4, "ace letter"), (8, 13, "ace suit")), "ink")
+    card.lay(blank_card())
+    card.sign(8, 12, "spade", "ink")
+    card.sign_corners("ace letter", "ace suit", "ink")
     return card.canvas
 
 
 def queen_of_hearts():
     """The game's own queen, who ends in her sleeves some pixels inside the edges."""
-    card, small = LeaningCard(-_LEAN), cards.new_card()
+    flat, small = blank_card(), cards.new_card()
     courts.draw(small, "hearts", "queen")
-    left = (card.canvas.width - small.width) // 2
-    top = (card.canvas.height - small.height) // 2
+    left, top = (flat.width - small.width) // 2, (flat.height - small.height) // 2
     for y in range(2, small.height - 2):
         for x in range(3, small.width - 3):
             if small.get(x, y) != "white":
-                card.canvas.put(x + left, y + top, small.get(x, y))
-    card.sign_corners(((3, 8, "queen letter"), (3, 17, "queen suit")), "card_red")
+                flat.put(x + left, y + top, small.get(x, y))
+    card = LeaningCard(-_LEAN)
+    card.lay(flat)
+    card.sign_corners("queen letter", "queen suit", "card_red")
     return card.canvas
 
 
@@ -123,9 +144,9 @@ def chip_stack(picture, x, y, count, colours):
 def title():
     picture = Canvas(WIDTH, HEIGHT)
     table(picture)
-    fill(picture, ellipse(50, 82, 24, 6), "felt_1")
-    picture.blit(queen_of_hearts(), 14, 27, "nothing")
-    picture.blit(ace_of_spades(), 42, 27, "nothing")
+    fill(picture, ellipse(47, 82, 26, 6), "felt_1")
+    picture.blit(queen_of_hearts(), 10, 26, "nothing")
+    picture.blit(ace_of_spades(), 38, 26, "nothing")
     chip_stack(picture, 12, 88, 4, chips.RED)
     chip_stack(picture, 65, 88, 3, chips.BLUE)
     chip_stack(picture, 39, 94, 1, chips.BLACK)
