@@ -3,8 +3,9 @@
 The dealer stands at the top, so all arcs have their centre above the picture. The player box
 hides (12, 92)-(120, 176); the dealer's cards lie from (79, 10), the player's from (79, 217), and
 those of a split from (19, 217) and (139, 217), each with a total some pixels to the right of where
-five cards end; the strategy button stands on the medallion. Nothing is darker than INK_LIMIT
-allows, so that dark red and black text keeps its contrast wherever it falls.
+five cards end, the last one up to (226, 257); the strategy button stands on the medallion. Nothing
+is darker than INK_LIMIT allows, so that dark red and black text keeps its contrast wherever it
+falls.
 """
 
 import math
@@ -28,11 +29,13 @@ _TEXT_STROKE = 0.58
 _MEDALLION = (180, 118)
 _PLAYERS_LINE = 321
 _CLOTH_INK = 8
-_INSIDE_FRAME = 6
-_NOTCH = 17
+_INSIDE_FRAME = 4
+# Small corners, as the total of the right hand of a split stands beside the lower one.
+_NOTCH = 12
 # The dealer's cards lie in a tray. The player's may be one hand or two, and their totals lie beside
-# them: all of that has room in one place.
-_DEALERS_TRAY, _PLAYERS_PLACE = (77, 8, 146, 53), (10, 212, 230, 260)
+# them: all of that has room in one tray.
+_TRAYS = ((77, 8, 146, 53), (11, 213, 229, 260))
+_SUIT_STEP = 15
 
 
 class Paper:
@@ -74,10 +77,10 @@ def _arc(inner, outer):
 
 
 def _notched(inset):
-    """The whole picture less an inset, a quarter circle cut out of each upper corner."""
+    """The whole picture less an inset, a quarter circle cut out of each corner."""
     def inside(x, y):
         dx, dy = min(x, WIDTH - x), min(y, HEIGHT - y)
-        return min(dx, dy) >= inset and math.hypot(dx, y) >= _NOTCH + inset
+        return min(dx, dy) >= inset and math.hypot(dx, dy) >= _NOTCH + inset
     return inside
 
 
@@ -123,7 +126,7 @@ def _bare(x, y):
     radius = _arc_radius(x, y)
     if radius < 231 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
         return False
-    return 14 < x < WIDTH - 14 and y < _PLAYERS_PLACE[1] - 8
+    return 14 < x < WIDTH - 14 and y < _TRAYS[1][1] - 8
 
 
 def _lay_cloth(paper):
@@ -150,24 +153,24 @@ def _lay_medallion(paper):
     paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
 
 
-def _lay_place(paper, place):
-    left, top, right, bottom = place
-    paper.lay(_outline(_rounded(left, top, right, bottom, 4),
-                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 3)), INK_LIMIT,
+def _lay_tray(paper, tray):
+    """A tray with as many suits in a row as have room in it."""
+    left, top, right, bottom = tray
+    paper.lay(_outline(_rounded(left, top, right, bottom, 6),
+                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 5)), INK_LIMIT,
               (left - 1, top - 1, right + 1, bottom + 1))
-
-
-def _lay_suits(paper, x, y, step):
-    """A row of the four suits about a point."""
-    for place, suit in enumerate(shapes.SUITS):
-        paper.lay_placed(suit, x + step * (place - 1.5), y, 6, 16)
+    count = (right - left) // _SUIT_STEP
+    for place in range(count):
+        x = (left + right) / 2 + _SUIT_STEP * (place - (count - 1) / 2)
+        paper.lay_placed(shapes.SUITS[place % 4], x, (top + bottom) / 2, 6, 16)
 
 
 def _lay_frame(paper):
-    paper.lay(_outline(_notched(2), _notched(3)), INK_LIMIT)
-    paper.lay(_outline(_notched(5), _notched(_INSIDE_FRAME)), 18)
-    for suit, x in ((shapes.spade, 8), (shapes.heart, WIDTH - 8)):
-        paper.lay_placed(suit, x, 8, 6, 24)
+    paper.lay(_outline(_notched(1), _notched(2)), INK_LIMIT)
+    paper.lay(_outline(_notched(3), _notched(_INSIDE_FRAME)), 18)
+    for place, (x, y) in enumerate(((6, 6), (WIDTH - 6, 6), (WIDTH - 6, HEIGHT - 6),
+                                    (6, HEIGHT - 6))):
+        paper.lay_placed(shapes.SUITS[place], x, y, 5, 24)
 
 
 def blackjack_table():
@@ -179,10 +182,8 @@ def blackjack_table():
         paper.lay(_arc(inner, outer), ink)
     _lay_inscription(paper)
     _lay_medallion(paper)
-    for place in (_DEALERS_TRAY, _PLAYERS_PLACE):
-        _lay_place(paper, place)
-    left, top, right, bottom = _DEALERS_TRAY
-    _lay_suits(paper, (left + right) / 2, (top + bottom) / 2, 15)
+    for tray in _TRAYS:
+        _lay_tray(paper, tray)
     _lay_frame(paper)
     return paper.canvas()
 

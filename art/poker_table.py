@@ -17,11 +17,11 @@ SEEN_HEIGHT = 268
 
 # Where the game puts things: left, top, right, bottom.
 BUTTON = (70, 180, 155, 215)
-# The longest result ends eight columns before the right edge of the picture: the two displays stand
-# on a strip that goes from side to side, below the cabinet's frame.
-STRIP_TOP = 219
-WALLET = (4, 230, 115, 254)
-RESULT = (WIDTH - 115, 230, WIDTH - 4, 254)
+# All panels have the same edges: as far out as the longest result needs, which ends eight columns
+# before the right edge of the picture. LEFT and RIGHT are those of what is inside their frames.
+LEFT, RIGHT = 4, WIDTH - 4
+WALLET = (LEFT, 230, 114, 254)
+RESULT = (WIDTH - 114, 230, RIGHT, 254)
 CARDS = [(x, 114, x + 29, 155) for x in (40, 73, 106, 139, 172)]
 
 PAYS = (
@@ -50,9 +50,8 @@ def grown(box, by):
 
 
 def sunk_panel(picture, box, face):
-    """A flat panel let into the cabinet, its frame two pixels wide around the box."""
-    bevel(picture, grown(box, 2), night(3), night(12))
-    bevel(picture, grown(box, 1), night(0), night(9))
+    """A flat panel let into the cabinet, its frame one pixel wide around the box."""
+    bevel(picture, grown(box, 1), night(0), night(12))
     picture.rect(*box, face)
 
 
@@ -71,23 +70,12 @@ _MIX = ((0, 8, 2, 10), (12, 4, 14, 6), (3, 11, 1, 9), (15, 7, 13, 5))
 
 
 def cabinet(picture):
-    """The body, lit from above, and the desk that carries the button and the panels."""
-    shaded(picture, (0, 0, WIDTH, STRIP_TOP), 8, 4)
-    for inset, light, dark in ((0, 14, 2), (1, 11, 3), (2, 3, 9)):
-        bevel(picture, (inset, inset, WIDTH - inset, STRIP_TOP - inset), night(light), night(dark))
-    shaded(picture, (3, 167, WIDTH - 3, STRIP_TOP - 3), 9, 6)
-    picture.rect(3, 165, WIDTH - 3, 166, night(2))
-    picture.rect(3, 166, WIDTH - 3, 167, night(14))
-
-
-def strip(picture):
-    """The front edge below the desk, with the two displays."""
-    shaded(picture, (0, STRIP_TOP, WIDTH, HEIGHT), 5, 3)
-    bevel(picture, (0, STRIP_TOP, WIDTH, SEEN_HEIGHT), night(12), night(1))
-    for box, label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
-        bevel(picture, grown(box, 1), night(0), night(12))
-        picture.rect(*box, "cell_blue" if label == "WALLET" else "cell_slate")
-        TINY.write(picture, box[0], box[1] - 8, label, night(18))
+    """The body, lighter at the top, the desk for the button and the panels, a rim around all."""
+    shaded(picture, (0, 0, WIDTH, HEIGHT), 8, 4)
+    shaded(picture, (1, 167, WIDTH - 1, SEEN_HEIGHT - 1), 9, 6)
+    picture.rect(1, 165, WIDTH - 1, 166, night(2))
+    picture.rect(1, 166, WIDTH - 1, 167, night(14))
+    bevel(picture, (0, 0, WIDTH, SEEN_HEIGHT), night(14), night(14))
 
 
 def soft_suit(picture, shape, x, y, half_height, ramp):
@@ -110,12 +98,12 @@ def bulb(picture, x, y, lit):
 
 
 def marquee(picture):
-    box = (9, 8, 231, 37)
+    box = (LEFT, 7, RIGHT, 37)
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
     for place in range(28):
-        for y in (top, bottom - 3):
-            bulb(picture, left + 2 + 8 * place, y, (place + (y > 20)) % 2 == 0)
+        for y in (top + 1, bottom - 4):
+            bulb(picture, left + 6 + 8 * place, y, (place + (y > 20)) % 2 == 0)
     BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
     BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
     nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
@@ -123,7 +111,7 @@ def marquee(picture):
 
 
 def pay_table(picture):
-    box = (9, 42, 231, 105)
+    box = (LEFT, 42, RIGHT, 105)
     sunk_panel(picture, box, night(3))
     left, top, right, _ = box
     middle, pitch = (left + right) // 2, 16
@@ -134,8 +122,8 @@ def pay_table(picture):
         if row % 2:
             picture.rect(x, y - 1, x + half, y + pitch - 1, night(2))
         best = place == 0
-        PLAIN.write(picture, x + 7, y + 4, name, "gold_light" if best else night(19))
-        BOLD.write_right(picture, x + half - 7, y + 4, pays, "gold_light")
+        PLAIN.write(picture, x + 8, y + 4, name, "gold_light" if best else night(19))
+        BOLD.write_right(picture, x + half - 8, y + 4, pays, "gold_light")
     picture.rect(middle - 1, top, middle, top + 63, night(0))
     picture.rect(middle, top, middle + 1, top + 63, night(7))
 
@@ -177,6 +165,11 @@ def _small_card(picture, x, y, face, edge):
     picture.rect(x + 2, y + 2, x + 8, y + 12, face)
 
 
+def displays(picture):
+    sunk_panel(picture, WALLET, "cell_blue")
+    sunk_panel(picture, RESULT, "cell_slate")
+
+
 def desk(picture):
     """What stands about the button: the player's chips, and the slot for the dollar."""
     for x, y in ((12, 198), (36, 202)):
@@ -184,15 +177,20 @@ def desk(picture):
         picture.rect(x + 9, y + 7, x + chips.WIDTH + 5, y + 11, night(5))
     chips.stack(picture, 12, 198, 5, chips.BLUE)
     chips.stack(picture, 36, 202, 3, chips.GOLD)
-    plate = (171, 180, 231, 215)
+    plate = (174, 180, RIGHT - 1, 215)
     bevel(picture, grown(plate, 2), night(13), night(2))
     bevel(picture, grown(plate, 1), night(11), night(3))
     shaded(picture, plate, 9, 6)
-    bevel(picture, (180, 186, 188, 209), night(1), night(12))
-    picture.rect(181, 187, 187, 208, night(4))
-    picture.rect(183, 189, 185, 206, night(0))
-    BOLD.write_centred(picture, 192, 228, 188, "$1", "gold_light")
-    TINY.write_centred(picture, 192, 228, 200, "A DEAL", night(18))
+    bevel(picture, (183, 186, 191, 209), night(1), night(12))
+    picture.rect(184, 187, 190, 208, night(4))
+    picture.rect(186, 189, 188, 206, night(0))
+    BOLD.write_centred(picture, 195, 231, 188, "$1", "gold_light")
+    TINY.write_centred(picture, 195, 231, 200, "A DEAL", night(18))
+
+
+def labels(picture):
+    for (left, top, _, _), label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
+        TINY.write(picture, left, top - 9, label, night(18))
 
 
 def poker_table():
@@ -203,7 +201,8 @@ def poker_table():
     card_bay(picture)
     desk(picture)
     button(picture)
-    strip(picture)
+    displays(picture)
+    labels(picture)
     return picture
 
 

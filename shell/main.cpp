@@ -1,7 +1,7 @@
 #include <cstdlib>
 #include <iostream>
 
-#include "platform/host/sdl_host.h"
+#include "platform/host/create_host.h"
 #include "shell/command_line.h"
 #include "shell/feltside_app.h"
 #include "shell/res/frame_resources.h"
@@ -14,7 +14,7 @@ constexpr int kExitNoDisplay = 3;
 int main(int argc, char** argv) {
   if (const auto exitCode = feltside::AnswerCommandLine(argc, argv)) return *exitCode;
   std::string why;
-  const auto host = platform::CreateSdlHost(
+  const auto host = platform::CreateHost(
       {feltside::kWindowSize, {"../share/feltside/help", FELTSIDE_HELP_FOLDER}}, why);
   if (host == nullptr) {
     std::cerr << "Feltside: " << why << '\n';

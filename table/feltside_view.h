@@ -14,6 +14,8 @@
 
 namespace feltside {
 
+enum Setting : int;
+
 inline constexpr int kGameBlackjack = 0;
 inline constexpr int kGameVideoPoker = 1;
 
@@ -102,7 +104,7 @@ class CFeltsideView : public platform::CView {
   /// Meanwhile the frame is disabled; keys that come are dropped, taps wait until it is over.
   void DealerPlay();
   /// Clears away the commands that were already waiting when the dealer began: the disabled frame
-  /// refuses them. Taps, keys and what asks to leave the program wait on, as in the pauses.
+  /// refuses them. Everything else is kept back, as in the pauses, until the deal is settled.
   void PumpMessages();
   /// Ends the deal and moves its money, with the dealer's hand as it stands.
   void Settle();
@@ -170,7 +172,8 @@ class CFeltsideView : public platform::CView {
   void OnDraw(platform::CSurface& surface) override;
   void DrawTitle(platform::CSurface& surface);
   void DrawTable(platform::CSurface& surface);
-  // Each picture is loaded at its first use and kept, the title's until the first deal.
+  // Each picture is loaded at its first use and kept: the title's until the first deal, the
+  // poker table's until it is switched off.
   void LoadTitleBitmap();
   void LoadTableBitmap();
   void LoadPokerBitmap();
@@ -195,7 +198,7 @@ class CFeltsideView : public platform::CView {
   /// While a hand is played its game stays selected, whatever the profile says.
   void LoadSettings();
   /// Stores these in one step, in this order.
-  void StoreSettings(std::initializer_list<const char*> names);
+  void StoreSettings(std::initializer_list<Setting> settings);
   /// Sets the dealer's pause by a speed, 0 slow to 2 fast; any other leaves it as it was.
   void SetPlaySpeed(int speed);
   /// The speed that the pause stands for; -1 for none.

@@ -15,7 +15,7 @@ DRAW, HOST, STORE, WINDOW, DIALOG = (
     f"platform/{room}/" for room in ("draw", "host", "store", "window", "dialog"))
 PLATFORM = (DRAW, HOST, STORE, WINDOW, DIALOG)
 GAME = ("engine/", "render/", "table/", "shell/")
-LAYOUT = ("render/table_layout.h", "render/picture_ids.h")
+LAYOUT = ("render/table_layout.h", "render/picture_ids.h", "render/money_text.h")
 
 # What of ours a file may include, by beginnings. The first line whose beginning fits the file holds
 # for it; a file that none fits lies where nothing of ours belongs.
@@ -26,7 +26,9 @@ OURS = [
     (WINDOW, (DRAW, HOST, STORE, WINDOW)),
     (DIALOG, PLATFORM),
     ("engine/", ("engine/", f"{HOST}runtime.h", f"{DIALOG}message_box.h")),
-    ("render/table_layout", LAYOUT + ("engine/", DRAW)),
+    *((f"render/{file}", LAYOUT + ("engine/", DRAW))
+      for file in ("table_layout", "targets", "drawing_toolkit", "money_text", "blackjack_drawing",
+                   "video_poker_drawing")),
     ("render/picture_ids", (DRAW,)),
     ("render/", ("engine/", "render/", "table/feltside_view.h") + PLATFORM),
     ("table/", ("engine/", "render/", "table/") + PLATFORM),
@@ -62,7 +64,8 @@ LIBRARY_NAME = re.compile(r"\b(?:SDL|FT|png)_\w+|\b(?:toml|utf8)::\w+")
 def source_files():
     """All headers and sources of ours, as paths from the root."""
     found = (path.relative_to(ROOT).as_posix()
-             for ending in ("h", "cpp") for path in ROOT.glob(f"*/**/*.{ending}"))
+             for ending in ("h", "cpp") for path in ROOT.rglob(f"*.{ending}")
+             if not any((folder / "CMakeCache.txt").exists() for folder in path.parents))
     return sorted(path for path in found if not path.startswith("build/"))
 
 

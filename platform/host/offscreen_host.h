@@ -19,15 +19,13 @@ class OffscreenHost : public Host {
   void PutInput(const InputEvent& event) { m_arrInput.push_back(event); }
   void SetClock(const LocalTime& now);
   /// Called when the program waits for input and there is none, again and again until it has put
-  /// some in. Once it answers false, and without a handler, the window is closed.
-  void SetIdleHandler(std::function<bool()> onIdle) { m_onIdle = std::move(onIdle); }
+  /// some in. Once it returns false, and without a handler, the window is closed.
+  void SetIdleHandler(std::function<bool()> onIdle) { m_fnOnIdle = std::move(onIdle); }
 
   const CBitmap& Shown() const { return m_shown; }
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
   /// Where text is wanted; nothing where none is.
   const std::optional<Rect>& TextPlace() const { return m_rcText; }
-  /// What keeps help viewers from coming up from now on.
-  void SetHelpTrouble(const std::string& trouble) { m_strHelpTrouble = trouble; }
 
   void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
@@ -42,21 +40,20 @@ class OffscreenHost : public Host {
   void SetClipboard(const std::string& text) override { m_strClipboard = text; }
   std::string StartHelpViewer(const std::string& commandLine) override {
     m_arrHelpCalls.push_back(commandLine);
-    return m_strHelpTrouble;
+    return {};
   }
   std::filesystem::path ProfileFolder() override { return m_profileFolder; }
 
  private:
   std::filesystem::path m_profileFolder;
   std::deque<InputEvent> m_arrInput;
-  std::function<bool()> m_onIdle;
+  std::function<bool()> m_fnOnIdle;
   std::int64_t m_nTicks = 0;
   LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then
   CBitmap m_shown;
   std::string m_strClipboard;
   std::vector<std::string> m_arrHelpCalls;
-  std::string m_strHelpTrouble;
   std::optional<Rect> m_rcText;
   std::optional<WindowPlace> m_windowPlace;
 };

@@ -1,4 +1,4 @@
-#include "platform/host/sdl_host.h"
+#include "platform/host/create_host.h"
 
 #include <SDL.h>
 #ifdef __GLIBC__
@@ -19,7 +19,7 @@ namespace {
 
 class SdlHost : public Host {
  public:
-  SdlHost(std::unique_ptr<SdlVideo> video, const SdlHostOptions& options)
+  SdlHost(std::unique_ptr<SdlVideo> video, const HostOptions& options)
       : m_pVideo(std::move(video)),
         m_window(options.frameSize),
         m_events(m_window),
@@ -97,7 +97,7 @@ void ReturnLargeBlocks() {
 
 }  // namespace
 
-std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& why) {
+std::unique_ptr<Host> CreateHost(const HostOptions& options, std::string& why) {
   ReturnLargeBlocks();
   auto video = std::make_unique<SdlVideo>();
   if (!video->Trouble().empty()) {

@@ -14,9 +14,9 @@ class ProfileTest : public testing::Test {
       : m_file(m_folder.Path() / "Maker" / name) {}
 
   /// 7 where there is none.
-  int GetInt(const std::string& entry) { return m_pProfile->Read("S").GetInt(entry, 7); }
+  int GetInt(const std::string& entry) { return m_pProfile->Read()["S"].GetInt(entry, 7); }
   std::string GetString(const std::string& entry) {
-    return m_pProfile->Read("S").GetString(entry, "absent");
+    return m_pProfile->Read()["S"].GetString(entry, "absent");
   }
   template <class Value>
   bool Store(const std::string& entry, const Value& value) {

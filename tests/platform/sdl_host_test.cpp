@@ -1,13 +1,12 @@
 // The host with a window, on SDL's driver without a display: events are put in where the desktop
 // puts them, and come out at the program's door.
 
-#include "platform/host/sdl_host.h"
-
 #include <SDL.h>
 #include <gtest/gtest.h>
 
 #include <optional>
 
+#include "platform/host/create_host.h"
 #include "platform/host/frame_fit.h"
 
 namespace feltside::tests {
@@ -40,7 +39,7 @@ class SdlHostTest : public testing::Test {
   SdlHostTest() {
     SDL_SetHint(SDL_HINT_VIDEODRIVER, "dummy");
     std::string why;
-    m_pHost = platform::CreateSdlHost({kFrame, {}}, why);
+    m_pHost = platform::CreateHost({kFrame, {}}, why);
     EXPECT_NE(m_pHost, nullptr) << why;
   }
 

@@ -103,8 +103,8 @@ TEST(Pictures, HaveCellsForTheTextsOfVideoPoker) {
   };
   for (const Cell& cell :
        {Cell{{97, 182, 138, 213}, Rgb(82, 23, 139), {103, 192}, {"Deal", "Play"}},
-        Cell{{4, 230, 115, 254}, Rgb(20, 71, 139), {26, 233}, {"$1000000", "$-1000000"}},
-        Cell{{125, 230, 236, 254},
+        Cell{{4, 230, 114, 254}, Rgb(20, 71, 139), {26, 233}, {"$1000000", "$-1000000"}},
+        Cell{{126, 230, 236, 254},
              Rgb(82, 115, 132),
              {135, 235},
              {"Three of a Kind", "Four of a Kind", "Straight Flush", "Royal Flush"}}}) {
