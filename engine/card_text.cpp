@@ -1,6 +1,8 @@
 #include "engine/card_text.h"
 
-#include "engine/card.h"
+#include <array>
+
+#include "engine/card_hand.h"
 
 namespace feltside {
 namespace {
@@ -27,6 +29,16 @@ int CardFromText(const std::string& word) {
   const std::size_t rank = PlaceOfRank(word.substr(0, word.size() - 1));
   if (suit == kNowhere || rank == kNowhere) return kNoCard;
   return static_cast<int>(suit * kRanks + rank + 1);
+}
+
+std::string CardName(int card) {
+  constexpr std::array<const char*, kRanks> kRankNames = {"ace",  "two",   "three", "four", "five",
+                                                          "six",  "seven", "eight", "nine", "ten",
+                                                          "jack", "queen", "king"};
+  constexpr std::array<const char*, kSuits> kSuitNames = {"spades", "hearts", "diamonds", "clubs"};
+  if (!IsCard(card)) return "no card";
+  return std::string(kRankNames[static_cast<std::size_t>(RankOf(card) - 1)]) + " of " +
+         kSuitNames[static_cast<std::size_t>(CCardHand::GetSuit(card))];
 }
 
 }  // namespace feltside

@@ -8,4 +8,7 @@ namespace feltside {
 /// suit (C, D, H or S), in capitals or not. kNoCard for any other word.
 int CardFromText(const std::string& word);
 
+/// A card as it is spoken of: "ten of hearts"; "no card" for what is none.
+std::string CardName(int card);
+
 }  // namespace feltside

@@ -48,11 +48,16 @@ void CFeltsideView::DrawStrategy() {
   const bool onRequest = m_nStrategyMode == kStrategyButton;
   if (onRequest && m_bShowVerdict != 0) m_layout.DrawVerdictLamp(m_bVerdictCorrect != 0);
   if (m_bHandInProgress == 0) return;
-  if (onRequest && m_bShowAdvice == 0) {
-    m_layout.DrawStrategyButton();
-  } else {
+  if (IsAdviceShown()) {
     m_layout.DrawAdvice(AdviceText());
+  } else {
+    m_layout.DrawStrategyButton();
   }
+}
+
+bool CFeltsideView::IsAdviceShown() const {
+  return m_nStrategyMode == kStrategyAlways ||
+         (m_nStrategyMode == kStrategyButton && m_bShowAdvice != 0);
 }
 
 std::string CFeltsideView::AdviceText() const {

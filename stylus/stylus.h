@@ -61,6 +61,7 @@ class CStylus {
   void Stack(const Words& words);
   void SetWallet(const Words& words);
   void Shot(const Words& words);
+  void TellWords(const Words&);
   void ShowState(const Words&) {}
   void Help(const Words&);
   void Close(const Words& words);

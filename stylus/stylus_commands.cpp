@@ -40,6 +40,7 @@ const std::vector<CStylus::Command>& CStylus::Commands() {
       {"stack", "C...", "puts cards next into the shoe: AS, TH or 10h, or 1 to 52", 1, kAnyNumber, &CStylus::Stack},
       {"wallet", "D", "sets the money to D dollars", 1, 1, &CStylus::SetWallet},
       {"shot", "FILE", "writes the whole window as PNG", 1, 1, &CStylus::Shot},
+      {"words", "", "answers what was said last to whoever plays by ear", 0, 0, &CStylus::TellWords},
       {"state", "", "does nothing", 0, 0, &CStylus::ShowState},
       {"help", "", "lists these lines and the names of commands", 0, 0, &CStylus::Help},
       {"close", "", "pushes the window's close button", 0, 0, &CStylus::Close},
@@ -178,6 +179,11 @@ void CStylus::Shot(const Words& words) {
   if (!platform::SavePng(m_host.Shown(), words[1])) {
     throw CommandError{"cannot write " + words[1]};
   }
+}
+
+void CStylus::TellWords(const Words&) {
+  m_bWithState = false;
+  m_answer["words"] = m_host.Said();
 }
 
 void CStylus::Help(const Words&) {

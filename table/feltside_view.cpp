@@ -24,6 +24,7 @@ void CFeltsideView::OnInitialUpdate() {
 void CFeltsideView::OnDeal() {
   m_bShowTitle = 0;
   m_pTitleBitmap.reset();
+  platform::TheApp().TellAnew();  // a deal may look like the last one
   if (m_nGameType == kGameBlackjack) {
     DealBlackjack();
   } else if (m_nGameType == kGameVideoPoker) {

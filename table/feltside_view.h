@@ -165,6 +165,20 @@ class CFeltsideView : public platform::CView {
   std::vector<platform::ToolTip> BlackjackTips() const;
   std::vector<platform::ToolTip> VideoPokerTips() const;
 
+  // table/words.cpp: the table in words, for whoever plays by ear.
+
+  platform::Phrases Words() const override;
+  platform::Phrases BlackjackWords() const;
+  void AddPlayerHands(platform::Phrases& words) const;
+  /// What the lamp says of the last move.
+  std::string VerdictWords() const;
+  /// What is to be known for the next step, and which keys take it.
+  std::string BlackjackChoices() const;
+  std::string Moves() const;
+  platform::Phrases VideoPokerWords() const;
+  /// Which cards are held.
+  std::string MarkWords() const;
+
   // render/frame.cpp: how a frame is put together.
 
   /// Returns true: the paint covers every pixel itself, so nothing is cleared before it.
@@ -184,6 +198,8 @@ class CFeltsideView : public platform::CView {
   void DrawPlayerSide();
   void DrawDealerSide();
   void DrawStrategy();
+  /// Whether there is advice in a hand; where not, the button for it, or nothing.
+  bool IsAdviceShown() const;
   std::string AdviceText() const;
 
   // render/video_poker_frame.cpp: one video-poker frame, on the surface that the layout has.

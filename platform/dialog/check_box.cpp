@@ -21,6 +21,10 @@ void CCheckBox::SetCheck(bool checked) {
 
 void CCheckBox::Activate() { SetCheck(!m_bChecked); }
 
+std::string CCheckBox::Words(const std::string&) const {
+  return WithoutMnemonic(GetText()) + ", check box, " + (m_bChecked ? "on" : "off");
+}
+
 void CCheckBox::OnPaint(CSurface& surface) {
   const Rect client = GetClientRect();
   const auto lines = WrapText(GetText(), client.right - kTextLeft - 1);

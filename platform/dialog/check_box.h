@@ -12,6 +12,7 @@ class CCheckBox : public CPressControl {
 
   const char* KindName() const override { return "check"; }
   int GetValue() const override { return m_bChecked ? 1 : 0; }
+  std::string Words(const std::string&) const override;
   /// The dialog is not told; it reads the box when it is confirmed.
   void SetCheck(bool checked);
   /// Ticks a clear box and clears a ticked one.

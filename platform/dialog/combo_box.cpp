@@ -21,6 +21,10 @@ Rect LineOf(const Rect& place) {
 CComboBox::CComboBox(CDialog& dialog, const ControlTemplate& control, const Rect& place)
     : CControl(dialog, control, LineOf(place)), m_arrItems(control.items) {}
 
+std::string CComboBox::Words(const std::string& label) const {
+  return label + " list, " + (m_nChoice < 0 ? "no choice" : GetText());
+}
+
 void CComboBox::SetCurSel(int item) {
   m_nChoice = item < 0 || item >= GetItemCount() ? -1 : item;
   SetText(m_nChoice < 0 ? "" : m_arrItems[static_cast<std::size_t>(m_nChoice)]);

@@ -18,6 +18,8 @@ class CComboBox : public CControl {
   const char* KindName() const override { return "list"; }
   bool IsTabStop() const override { return true; }
   char Mnemonic() const override { return 0; }
+  bool IsLabelled() const override { return true; }
+  std::string Words(const std::string& label) const override;
   /// The place of the choice; -1 for none.
   int GetValue() const override { return m_nChoice; }
   int GetItemCount() const { return static_cast<int>(m_arrItems.size()); }

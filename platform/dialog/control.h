@@ -26,6 +26,10 @@ class CControl : public CWindow {
   virtual int GetValue() const { return 0; }
   /// What the control is, in a word.
   virtual const char* KindName() const = 0;
+  /// Whether the static before it in the template is its label, and is told with it.
+  virtual bool IsLabelled() const { return false; }
+  /// Label, kind and value, for whoever does not see them; empty where there is nothing to tell.
+  virtual std::string Words(const std::string&) const { return {}; }
 
   /// The letter that activates the control, as a capital; 0 for none.
   virtual char Mnemonic() const;

@@ -211,6 +211,29 @@ bool CDialog::OnKeyDown(const KeyStroke& stroke) {
   }
 }
 
+Phrases CDialog::Words() const {
+  Phrases words = {GetTitle()};
+  std::string focused;
+  for (std::size_t i = 0; i < m_arrControls.size(); ++i) {
+    const CControl& control = *m_arrControls[i];
+    if (&control == GetFocus()) focused = WordsOf(i);
+    if (!control.IsVisible() || control.IsTabStop() || IsLabel(i)) continue;
+    words.push_back(WordsOf(i));
+  }
+  words.push_back(focused);
+  return words;
+}
+
+/// Whether a control is the label of the next one.
+bool CDialog::IsLabel(std::size_t control) const {
+  return control + 1 < m_arrControls.size() && m_arrControls[control + 1]->IsLabelled();
+}
+
+std::string CDialog::WordsOf(std::size_t control) const {
+  const bool labelled = control > 0 && IsLabel(control - 1);
+  return m_arrControls[control]->Words(labelled ? m_arrControls[control - 1]->Words({}) : "");
+}
+
 void CDialog::OnPaint(CSurface& surface) {
   surface.SetPen(kBlack);
   surface.SetBrush(kFaceColor);

@@ -62,6 +62,8 @@ class CDialog : public CTopWindow {
   virtual bool HasHelp() const { return false; }
   virtual void OnHelp() {}
 
+  /// The title, the texts, then the control that has the keyboard.
+  Phrases Words() const override;
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override;
   void OnMouseMove(Point p) override;
@@ -82,6 +84,8 @@ class CDialog : public CTopWindow {
   Rect CloseButton() const;
   Rect HelpButton() const;
   void MakeControls(const DialogTemplate& form);
+  bool IsLabel(std::size_t control) const;
+  std::string WordsOf(std::size_t control) const;
   void DrawCaption(CSurface& surface) const;
   void FocusStep(int direction);
   void FocusFrom(std::size_t start, int direction);

@@ -39,6 +39,13 @@ CDropList::CDropList(const std::vector<std::string>& items, int chosen, const Re
       m_nHighlighted(chosen),
       m_fnChosen(std::move(onChosen)) {}
 
+Phrases CDropList::Words() const {
+  const std::string count = std::to_string(m_arrItems.size());
+  if (m_nHighlighted < 0) return {"List of " + count};
+  return {std::to_string(m_nHighlighted + 1) + " of " + count + ", " +
+          m_arrItems[static_cast<std::size_t>(m_nHighlighted)]};
+}
+
 void CDropList::OnPaint(CSurface& surface) {
   surface.SetPen(kBlack);
   surface.SetBrush(kWhite);

@@ -19,6 +19,8 @@ class CDropList : public CTopWindow {
   CDropList(const std::vector<std::string>& items, int chosen, const Rect& line,
             std::function<void(int item)> onChosen);
 
+  /// The item under the highlight.
+  Phrases Words() const override;
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override { Highlight(ItemAt(p)); }
   void OnMouseMove(Point p) override;

@@ -23,6 +23,10 @@ int TextTop(const Rect& client) { return (client.bottom - kSystemFont.height) / 
 
 }  // namespace
 
+std::string CEditBox::Words(const std::string& label) const {
+  return label + " text, " + (GetText().empty() ? "empty" : GetText());
+}
+
 void CEditBox::SetText(const std::string& text) {
   CControl::SetText(OneLine(text));
   m_nCaret = m_nAnchor = GetText().size();

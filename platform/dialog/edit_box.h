@@ -16,6 +16,8 @@ class CEditBox : public CControl {
   const char* KindName() const override { return "edit"; }
   bool IsTabStop() const override { return true; }
   bool WantsLetters() const override { return true; }
+  bool IsLabelled() const override { return true; }
+  std::string Words(const std::string& label) const override;
   void SetText(const std::string& text) override;
   char Mnemonic() const override { return 0; }
   void Activate() override { TakeFocus(); }

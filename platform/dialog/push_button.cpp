@@ -9,6 +9,10 @@ CPushButton::CPushButton(CDialog& dialog, const ControlTemplate& control, const 
     : CPressControl(dialog, control, place),
       m_bDefault(control.kind == ControlKind::kDefaultButton) {}
 
+std::string CPushButton::Words(const std::string&) const {
+  return WithoutMnemonic(GetText()) + ", button";
+}
+
 void CPushButton::OnPaint(CSurface& surface) {
   const Rect client = GetClientRect();
   surface.FillRect(client, m_bDefault ? kBlack : kFaceColor);

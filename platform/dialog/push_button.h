@@ -11,6 +11,7 @@ class CPushButton : public CPressControl {
   CPushButton(CDialog& dialog, const ControlTemplate& control, const Rect& place);
 
   const char* KindName() const override { return "button"; }
+  std::string Words(const std::string&) const override;
   void Activate() override;
   /// Whether Enter means this button while no other has the focus.
   bool IsDefault() const { return m_bDefault; }

@@ -14,6 +14,10 @@ constexpr int kMargin = 3;  ///< above and below the channel
 
 }  // namespace
 
+std::string CSlider::Words(const std::string& label) const {
+  return label + " slider at " + std::to_string(m_nPos);
+}
+
 void CSlider::SetRange(int lowest, int highest) {
   m_nLowest = lowest;
   m_nHighest = highest;

@@ -13,6 +13,8 @@ class CSlider : public CControl {
 
   const char* KindName() const override { return "slider"; }
   bool IsTabStop() const override { return true; }
+  bool IsLabelled() const override { return true; }
+  std::string Words(const std::string& label) const override;
   int GetValue() const override { return m_nPos; }
   int GetLowest() const { return m_nLowest; }
   int GetHighest() const { return m_nHighest; }

@@ -17,6 +17,11 @@ void CStatic::SetText(const std::string& text) {
   Dialog().Invalidate();
 }
 
+std::string CStatic::Words(const std::string& label) const {
+  if (!m_bPlainText) return WithoutMnemonic(GetText());
+  return GetText().empty() ? "" : label + " " + GetText();
+}
+
 void CStatic::OnPaint(CSurface& surface) {
   const int width = GetClientRect().right;
   if (m_bPlainText) {

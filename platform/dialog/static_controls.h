@@ -10,6 +10,9 @@ class CStatic : public CControl {
   CStatic(CDialog& dialog, const ControlTemplate& control, const Rect& place);
 
   const char* KindName() const override { return "static"; }
+  /// A plain text is a value.
+  bool IsLabelled() const override { return m_bPlainText; }
+  std::string Words(const std::string& label) const override;
   void SetText(const std::string& text) override;
   char Mnemonic() const override { return m_bPlainText ? '\0' : CControl::Mnemonic(); }
   /// A label may stand close to its control, so only its letters are drawn.

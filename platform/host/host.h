@@ -47,6 +47,11 @@ class Host {
   virtual std::string GetClipboard() = 0;
   virtual void SetClipboard(const std::string& text) = 0;
 
+  /// Whether what is said may be heard; where not, nothing is put into words.
+  virtual bool HasVoice() const = 0;
+  /// Has a short text of whole sentences read out, which tells what is new in the window.
+  virtual void Say(const std::string& text) = 0;
+
   /// Starts the help viewer with a command line such as "file:page.htm#topic", beside the program.
   /// Returns what is known to have kept it from coming up, in a sentence for the person that names
   /// the page's place; empty where nothing is known to.

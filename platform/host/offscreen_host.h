@@ -26,6 +26,8 @@ class OffscreenHost : public Host {
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
   /// Where text is wanted; nothing where none is.
   const std::optional<Rect>& TextPlace() const { return m_rcText; }
+  /// What was said last; empty before anything was.
+  const std::string& Said() const { return m_strSaid; }
 
   void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
@@ -38,6 +40,8 @@ class OffscreenHost : public Host {
   void SetTextInput(const std::optional<Rect>& place) override { m_rcText = place; }
   std::string GetClipboard() override { return m_strClipboard; }
   void SetClipboard(const std::string& text) override { m_strClipboard = text; }
+  bool HasVoice() const override { return true; }
+  void Say(const std::string& text) override { m_strSaid = text; }
   std::string StartHelpViewer(const std::string& commandLine) override {
     m_arrHelpCalls.push_back(commandLine);
     return {};
@@ -53,6 +57,7 @@ class OffscreenHost : public Host {
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then
   CBitmap m_shown;
   std::string m_strClipboard;
+  std::string m_strSaid;
   std::vector<std::string> m_arrHelpCalls;
   std::optional<Rect> m_rcText;
   std::optional<WindowPlace> m_windowPlace;

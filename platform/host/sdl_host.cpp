@@ -71,6 +71,10 @@ class SdlHost : public Host {
   std::string GetClipboard() override { return TakeText(SDL_GetClipboardText()); }
   void SetClipboard(const std::string& text) override { SDL_SetClipboardText(text.c_str()); }
 
+  // SDL knows no way to a desktop's screen readers.
+  bool HasVoice() const override { return false; }
+  void Say(const std::string&) override {}
+
   std::string StartHelpViewer(const std::string& commandLine) override {
     // Long enough for an opener to find no browser, and short beside a browser's start.
     constexpr int kPatience = 1000;

@@ -79,6 +79,7 @@ void CApplication::OnIdle() {
     ShowNextNotice();
     Refresh();
   }
+  if (m_screen.Top() != nullptr) m_narrator.TellOf(*m_screen.Top());
 }
 
 void CApplication::TakeTroubles() {

@@ -9,6 +9,7 @@
 #include "platform/store/profile.h"
 #include "platform/window/command.h"
 #include "platform/window/message_queue.h"
+#include "platform/window/narrator.h"
 #include "platform/window/screen.h"
 
 namespace platform {
@@ -43,6 +44,8 @@ class CApplication : public CCommandTarget {
   /// Has trouble told to the person, in a sentence, once in a run: when the program lies idle and
   /// can be interrupted, at the latest when it ends. The error stream is the caller's.
   void Notify(const std::string& trouble);
+  /// Has all that the topmost window shows put into words, also what was told before.
+  void TellAnew() { m_narrator.Forget(); }
   /// Opens the help viewer; trouble with it is notified.
   void ShowHelp(const std::string& commandLine);
 
@@ -83,6 +86,7 @@ class CApplication : public CCommandTarget {
   CResources m_resources;
   CMessageQueue m_queue;
   CScreen m_screen;
+  CNarrator m_narrator;
   std::unique_ptr<CProfile> m_pProfile;
   std::unique_ptr<CSingleDocTemplate> m_pDocTemplate;
   CFrameWindow* m_pMainFrame = nullptr;

@@ -47,6 +47,8 @@ class CFrameWindow : public CTopWindow, public CCommandTarget {
   /// Has the tool bar show which commands may run.
   virtual void RefreshCommandStates() {}
 
+  /// Those of the view.
+  Phrases Words() const override { return m_pView->Words(); }
   bool OnKeyDown(const KeyStroke& stroke) override;
 
  private:

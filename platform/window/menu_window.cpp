@@ -54,6 +54,14 @@ CMenuWindow::CMenuWindow(const MenuTemplate& menu, Point at, std::function<void(
   }
 }
 
+Phrases CMenuWindow::Words() const {
+  const std::string title = GetTitle() + " menu";
+  if (m_nSelected < 0) return {title};
+  const Line& line = m_arrLines[static_cast<std::size_t>(m_nSelected)];
+  return {title, WithoutMnemonic(line.item.text) + (line.key.empty() ? "" : ", " + line.key) +
+                     (line.enabled ? "" : ", not now")};
+}
+
 void CMenuWindow::OnPaint(CSurface& surface) {
   DrawButtonFace(surface, surface.Bounds(), false);
   for (std::size_t i = 0; i < m_arrLines.size(); ++i) DrawLine(surface, i);

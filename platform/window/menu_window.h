@@ -35,6 +35,8 @@ class CMenuWindow : public CTopWindow {
   /// Highlights the first item, as a menu opened by a key does.
   void SelectFirst();
 
+  /// The title and the line under the highlight.
+  Phrases Words() const override;
   void OnPaint(CSurface& surface) override;
   void OnLButtonDown(Point p) override { Track(p); }
   void OnMouseMove(Point p) override { Track(p); }

@@ -16,7 +16,10 @@ CTopWindow::~CTopWindow() { Close(); }
 
 void CTopWindow::Open() { TheApp().Screen().Push(*this); }
 
-void CTopWindow::Close() { TheApp().Screen().Remove(*this); }
+void CTopWindow::Close() {
+  TheApp().Screen().Remove(*this);
+  TheApp().TellAnew();  // whoever comes back to a window may have forgotten it
+}
 
 void CTopWindow::PaintIfNeeded() {
   if (PaintInto(m_pixels, {}, false)) TheApp().Screen().MarkStale();

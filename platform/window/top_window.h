@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "platform/window/narrator.h"
 #include "platform/window/window.h"
 
 namespace platform {
@@ -42,6 +43,9 @@ class CTopWindow : public CWindow {
   bool RouteText(const std::string& text);
   bool RouteComposition(const std::string& text);
 
+  /// What the window shows, for whoever does not see it: a phrase for each thing, what is most to
+  /// the point at the moment last.
+  virtual Phrases Words() const { return {m_strTitle}; }
   /// A press beside a popup.
   virtual void OnPressOutside() {}
   /// A child is about to be destroyed.

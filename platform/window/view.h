@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/window/command.h"
+#include "platform/window/narrator.h"
 #include "platform/window/window.h"
 
 namespace platform {
@@ -12,6 +13,8 @@ class CView : public CWindow, public CCommandTarget {
 
   /// The view is shown for the first time with its document, or the document was renewed.
   virtual void OnInitialUpdate() { Invalidate(); }
+  /// What it shows, as CTopWindow::Words.
+  virtual Phrases Words() const = 0;
   /// Paints the whole client area.
   virtual void OnDraw(CSurface& surface) = 0;
 

@@ -62,7 +62,8 @@ std::set<std::string> TextsOfTheGame() {
   for (const char* folder : {"engine", "render", "table", "shell", "platform/dialog"}) {
     for (const auto& entry :
          fs::recursive_directory_iterator(FELTSIDE_SOURCES / fs::path(folder))) {
-      if (entry.path().extension() == ".png") continue;
+      // What is only spoken is never drawn.
+      if (entry.path().extension() == ".png" || entry.path().stem() == "words") continue;
       std::ifstream file(entry.path());
       std::string part;
       for (bool quoted = false; std::getline(file, part, '"'); quoted = !quoted) {

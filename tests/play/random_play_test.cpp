@@ -9,6 +9,7 @@
 #include <memory>
 #include <random>
 
+#include "stylus/stylus_words.h"
 #include "tests/play/table_model.h"
 #include "tests/support/script.h"
 
@@ -17,6 +18,7 @@ namespace {
 
 constexpr int kCommands = 25000;
 constexpr int kLeaveEvery = 200;  ///< commands until all dialogs are left
+constexpr int kListenEvery = 7;   ///< commands until it is heard what was said
 constexpr int kMostEscapes = 6;
 
 using Texts = std::vector<std::string>;
@@ -167,6 +169,24 @@ bool PlayOn(Table& table, const std::string& command) {
 constexpr unsigned kFirstSeed = 1;
 constexpr unsigned kSecondSeed = 2;
 
+/// Whatever is said ends with what may be done by then. Returns what is said or missing wrongly.
+std::string WrongWords(const std::string& words, const Json& state) {
+  const auto may = [&state](const char* command) -> bool {
+    return state["enabled"][std::to_string(ToCommand(command))];
+  };
+  for (const auto& [phrase, expected] : std::vector<std::pair<std::string, bool>>{
+           {"H to hit", may("hit")},
+           {"S to stand", may("stand")},
+           {"D to double down", may("double")},
+           {"P to split", may("split")},
+           {"I to take it", state["m_bInsuranceOffered"] == 1},
+           {"Enter to play", state["m_bDrawPending"] == 1},
+           {"Enter to deal", may("deal")}}) {
+    if ((words.find(phrase) != std::string::npos) != expected) return phrase;
+  }
+  return {};
+}
+
 class RandomPlay : public testing::TestWithParam<unsigned> {};
 
 /// One that nobody has seen before, or FELTSIDE_SEED, by which a failure is played again.
@@ -193,6 +213,10 @@ TEST_P(RandomPlay, KeepsTheTableInOrder) {
       command = "key Ctrl+N";
     }
     const bool runs = table->state["running"] && PlayOn(*table, command);
+    if (runs && i % kListenEvery == 0 && table->state["windows"].size() == 1) {
+      const std::string words = table->stylus.Send("words")["words"];
+      EXPECT_EQ(WrongWords(words, table->state), "") << words;
+    }
     ++seen[table->state["windows"].empty() ? "" : table->state["windows"].back()];
     if (runs) continue;
     settled += table->model.Settled();

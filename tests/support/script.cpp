@@ -62,6 +62,8 @@ class Player {
       m_pStylus.reset();
     } else if (head == "kept") {
       ExpectKept(rest);
+    } else if (head == "says") {
+      EXPECT_EQ(Program().Send("words")["words"], rest);
     } else if (head == "look") {
       m_looks[rest] = Program().Shot();
     } else if (head != "--") {
