@@ -3,6 +3,8 @@
 from pathlib import Path
 from typing import Callable, NamedTuple
 
+from PIL import Image
+
 from lettering import BOLD, TINY
 from pixels import Canvas, read_grids
 
@@ -113,6 +115,13 @@ def _save(canvas, times, path):
     magnified(canvas, times).save(path, 16, transparent="nothing")
 
 
+def _make_program_icon(pictures, path):
+    """The icon inside a program for Windows, which asks for it in many sizes and in full colour."""
+    images = [Image.open(picture).convert("RGBA") for picture in pictures]
+    path.parent.mkdir(parents=True, exist_ok=True)
+    images[-1].save(path, "ICO", append_images=images, sizes=[image.size for image in images])
+
+
 def make_all(output_dir):
     """The program's own icon, in the sizes that its window takes."""
     for size, drawn, times in ((16, 16, 1), (32, 32, 1), (48, 48, 1), (128, 64, 2), (256, 64, 4)):
@@ -121,9 +130,12 @@ def make_all(output_dir):
 
 def make_editions(folder):
     """The icons that a desktop's menus show, and those of a page that a browser installs."""
+    pictures = []
     for size in (16, 22, 24, 32, 48, 64, 128, 256):
         drawn = min(size, 64)
-        _save(icon(drawn), size // drawn, folder / "desktop" / "icons" / f"feltside_{size}.png")
+        pictures.append(folder / "desktop" / "icons" / f"feltside_{size}.png")
+        _save(icon(drawn), size // drawn, pictures[-1])
+    _make_program_icon(pictures, folder / "windows" / "feltside.ico")
     web = folder / "web" / "icons"
     _save(icon(64), 3, web / "feltside_192.png")
     _save(icon(64), 8, web / "feltside_512.png")

@@ -41,6 +41,7 @@ OURS = [
 
 SDL = r"SDL.*"
 SYSTEM = r"(sys/\w+|fcntl|unistd|pwd|signal|poll|errno|dirent)\.h"
+WINDOWS = r"(windows|shellapi|fcntl|io|process|share|sys/stat)\.h"
 GTEST = r"g(test|mock)/g(test|mock).*\.h"
 JSON = r"nlohmann/.*"
 
@@ -50,6 +51,7 @@ LIBRARIES = [
     (r"platform/host/sdl_\w+\.h", SDL),
     (r"platform/host/\w+\.cpp", f"{SDL}|malloc\\.h|{SYSTEM}"),
     (r"platform/store/\w+\.cpp", rf"toml\+\+/.*|{SYSTEM}"),
+    (r"(platform/\w+|tests/\w+)/windows_\w+\.cpp", WINDOWS),
     (r"stylus/.*", JSON),
     (r"tests/platform/sdl_\w+\.cpp", SDL),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),

@@ -1,6 +1,6 @@
 #include "platform/host/offscreen_host.h"
 
-#include <ctime>
+#include <chrono>
 
 namespace platform {
 
@@ -28,16 +28,19 @@ void OffscreenHost::SetClock(const LocalTime& now) {
 }
 
 LocalTime OffscreenHost::Now() {
-  std::tm time{};
-  time.tm_year = m_clock.year - 1900;
-  time.tm_mon = m_clock.month - 1;
-  time.tm_mday = m_clock.day;
-  time.tm_hour = m_clock.hour;
-  time.tm_min = m_clock.minute;
-  time.tm_sec = m_clock.second + static_cast<int>((m_nTicks - m_nClockSetAt) / 1000);
-  timegm(&time);
-  return {time.tm_year + 1900, time.tm_mon + 1, time.tm_mday,
-          time.tm_hour,        time.tm_min,     time.tm_sec};
+  using namespace std::chrono;
+  const year_month_day set = year(m_clock.year) / m_clock.month / m_clock.day;
+  const auto now = sys_days(set) + hours(m_clock.hour) + minutes(m_clock.minute) +
+                   seconds(m_clock.second + (m_nTicks - m_nClockSetAt) / 1000);
+  const auto today = floor<days>(now);
+  const year_month_day date(today);
+  const hh_mm_ss time(now - today);
+  return {static_cast<int>(date.year()),
+          static_cast<int>(static_cast<unsigned>(date.month())),
+          static_cast<int>(static_cast<unsigned>(date.day())),
+          static_cast<int>(time.hours().count()),
+          static_cast<int>(time.minutes().count()),
+          static_cast<int>(time.seconds().count())};
 }
 
 }  // namespace platform

@@ -10,6 +10,7 @@
 #include <system_error>
 #include <utility>
 
+#include "platform/host/utf8_path.h"
 #include "platform/store/atomic_file.h"
 #include "platform/store/profile.h"
 #include "platform/store/toml_text.h"
@@ -109,7 +110,7 @@ class CFileProfile : public CProfile {
   std::string SetAside();
   std::string KeepCopy(const std::string& text, const std::string& name);
   std::string Store(const std::string& section, const Change& change);
-  std::string Named() const { return "The settings' file " + m_file.string(); }
+  std::string Named() const { return "The settings' file " + ToUtf8(m_file); }
 
   fs::path m_file;
 };
@@ -175,7 +176,7 @@ std::string CFileProfile::SetAside() {
   if (error) {
     return "it cannot be understood, and not be kept under another name (" + Reason(error) + ")";
   }
-  Tell(Named() + " cannot be understood. It is kept as " + kept.string() +
+  Tell(Named() + " cannot be understood. It is kept as " + ToUtf8(kept) +
        ", and the defaults hold.");
   return {};
 }
@@ -184,10 +185,10 @@ std::string CFileProfile::SetAside() {
 /// written in its place.
 std::string CFileProfile::KeepCopy(const std::string& text, const std::string& name) {
   const fs::path kept = NameForDamaged(m_file);
-  const std::error_code error = ReplaceFile(kept, text);
+  const std::error_code error = WriteWhole(kept, text);
   if (error) return "what it holds as " + name + " cannot be kept (" + Reason(error) + ")";
   Tell(Named() + " held something else as " + name + ". The file as it was is kept as " +
-       kept.string() + ".");
+       ToUtf8(kept) + ".");
   return {};
 }
 
@@ -203,7 +204,7 @@ std::string CFileProfile::Store(const std::string& section, const Change& change
   const auto changed = ChangeSection(stored.text, section, values);
   if (!changed) return "what else it holds cannot be written again";
   std::string refusal = changed->foreign.empty() ? "" : KeepCopy(stored.text, changed->foreign);
-  if (refusal.empty()) refusal = Reason(ReplaceFile(m_file, changed->text));
+  if (refusal.empty()) refusal = Reason(WriteWhole(m_file, changed->text));
   if (!refusal.empty()) ListLost(values);
   return refusal;
 }

@@ -78,7 +78,7 @@ CFileLock::~CFileLock() {
   if (m_nDescriptor >= 0) close(m_nDescriptor);
 }
 
-std::error_code ReplaceFile(const fs::path& file, const std::string& text) {
+std::error_code WriteWhole(const fs::path& file, const std::string& text) {
   if (access(file.c_str(), W_OK) != 0 && errno != ENOENT) return LastError();
   const fs::path fresh = fs::path(file) += ".new";
   const fs::path folder = file.parent_path();
