@@ -18,24 +18,23 @@ WIDTH, HEIGHT = 240, 268
 # 255 - 226: the darkest step of the paper ramp.
 INK_LIMIT = 29
 
-_ARC_CENTRE = (120, -136)
+_ARC_CENTRE = (120, -800)
 _TEXT = "BLACKJACK PAYS 3 TO 2"
-_TEXT_TOP = 204.5
+_TEXT_TOP = 871
 _TEXT_UNIT = 10 / 6
 _TEXT_GAP = 1.9
 _TEXT_BLANK = 2.6
 _TEXT_STROKE = 0.58
 
 _MEDALLION = (180, 118)
-_PLAYERS_LINE = 321
+# Radii: the band with the inscription, and the line that ends the player's field.
+_BAND_TOP, _PLAYERS_LINE = 862, 986
 _CLOTH_INK = 8
 _INSIDE_FRAME = 4
-# Small corners, as the total of the right hand of a split stands beside the lower one.
-_NOTCH = 12
-# The dealer's cards lie in a tray. The player's may be one hand or two, and their totals lie beside
-# them: all of that has room in one tray.
-_TRAYS = ((77, 8, 146, 53), (11, 213, 229, 260))
-_SUIT_STEP = 15
+# Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie beside
+# them.
+_TRAYS = ((10, 6, 230, 55), (10, 213, 230, 262))
+_TRAY_INK = 3
 
 
 class Paper:
@@ -72,16 +71,8 @@ def _arc_radius(x, y):
 
 def _arc(inner, outer):
     """A line across the table, from frame to frame."""
-    within_frame = _notched(_INSIDE_FRAME)
+    within_frame = _framed(_INSIDE_FRAME)
     return lambda x, y: inner <= _arc_radius(x, y) < outer and within_frame(x, y)
-
-
-def _notched(inset):
-    """The whole picture less an inset, a quarter circle cut out of each corner."""
-    def inside(x, y):
-        dx, dy = min(x, WIDTH - x), min(y, HEIGHT - y)
-        return min(dx, dy) >= inset and math.hypot(dx, dy) >= _NOTCH + inset
-    return inside
 
 
 def _rounded(left, top, right, bottom, radius):
@@ -90,6 +81,11 @@ def _rounded(left, top, right, bottom, radius):
         dy = max(top + radius - y, y - bottom + radius, 0)
         return math.hypot(dx, dy) < radius
     return inside
+
+
+def _framed(inset):
+    """The whole picture less an inset, with round corners."""
+    return _rounded(inset, inset, WIDTH - inset, HEIGHT - inset, 10 - inset)
 
 
 def _outline(outer, inner):
@@ -124,7 +120,7 @@ def _lay_letter(paper, letter, place, width):
 def _bare(x, y):
     """Whether a small suit of the cloth has room at a point."""
     radius = _arc_radius(x, y)
-    if radius < 231 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
+    if radius < _BAND_TOP + 36 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
         return False
     return 14 < x < WIDTH - 14 and y < _TRAYS[1][1] - 8
 
@@ -154,32 +150,24 @@ def _lay_medallion(paper):
 
 
 def _lay_tray(paper, tray):
-    """A tray with as many suits in a row as have room in it."""
     left, top, right, bottom = tray
-    paper.lay(_outline(_rounded(left, top, right, bottom, 6),
-                       _rounded(left + 1, top + 1, right - 1, bottom - 1, 5)), INK_LIMIT,
-              (left - 1, top - 1, right + 1, bottom + 1))
-    count = (right - left) // _SUIT_STEP
-    for place in range(count):
-        x = (left + right) / 2 + _SUIT_STEP * (place - (count - 1) / 2)
-        paper.lay_placed(shapes.SUITS[place % 4], x, (top + bottom) / 2, 6, 16)
+    outer = _rounded(left, top, right, bottom, 5)
+    paper.lay(outer, _TRAY_INK, tray)
+    paper.lay(_outline(outer, _rounded(left + 1, top + 1, right - 1, bottom - 1, 4)), INK_LIMIT, tray)
 
 
 def _lay_frame(paper):
-    paper.lay(_outline(_notched(1), _notched(2)), INK_LIMIT)
-    paper.lay(_outline(_notched(3), _notched(_INSIDE_FRAME)), 18)
-    for place, (x, y) in enumerate(((6, 6), (WIDTH - 6, 6), (WIDTH - 6, HEIGHT - 6),
-                                    (6, HEIGHT - 6))):
-        paper.lay_placed(shapes.SUITS[place], x, y, 5, 24)
+    paper.lay(_outline(_framed(1), _framed(2)), INK_LIMIT)
+    paper.lay(_outline(_framed(3), _framed(_INSIDE_FRAME)), 18)
 
 
 def blackjack_table():
     paper = Paper()
     _lay_cloth(paper)
-    for inner, outer, ink in ((195, 196, 18), (197.5, 199, INK_LIMIT),
-                              (220, 221.5, INK_LIMIT), (223, 224, 18),
-                              (319, 320.2, 22), (322, 323, 14)):
-        paper.lay(_arc(inner, outer), ink)
+    for offset, width, ink in ((0, 1, 18), (2.5, 1.5, INK_LIMIT), (25, 1.5, INK_LIMIT), (28, 1, 18)):
+        paper.lay(_arc(_BAND_TOP + offset, _BAND_TOP + offset + width), ink)
+    for offset, width, ink in ((-2, 1.2, 22), (1, 1, 14)):
+        paper.lay(_arc(_PLAYERS_LINE + offset, _PLAYERS_LINE + offset + width), ink)
     _lay_inscription(paper)
     _lay_medallion(paper)
     for tray in _TRAYS:
