@@ -6,6 +6,7 @@
 #include <array>
 #include <limits>
 #include <type_traits>
+#include <utility>
 
 #include "shell/feltside_app.h"
 #include "table/feltside_view.h"
@@ -33,6 +34,11 @@ struct CFeltsideView::Settings {
     int absent;           ///< the default
     int (*get)(const View&);
     void (*set)(View&, int);
+
+    void Load(View& view, const platform::CProfileSection& stored) const {
+      const int value = stored.GetInt(name, absent);
+      set(view, value >= lowest && value <= highest ? value : absent);
+    }
   };
 
   // Of a member, or of one of a member: view.*a.*b.
@@ -79,15 +85,20 @@ constexpr std::array<CFeltsideView::Settings::Setting, 11> CFeltsideView::Settin
 
 void CFeltsideView::LoadSettings() {
   const platform::CProfileSection& stored = TheFeltsideApp().ReadSettings();
+  for (const Settings::Setting& setting : Settings::kAll) setting.Load(*this, stored);
+  m_bSettingsUnread = stored.WasRead() ? 0 : 1;
+}
+
+void CFeltsideView::LoadUnreadSettings(const platform::CProfileSection& stored) {
+  if (std::exchange(m_bSettingsUnread, 0) == 0) return;
   for (const Settings::Setting& setting : Settings::kAll) {
-    const int value = stored.GetInt(setting.name, setting.absent);
-    const bool isInRange = value >= setting.lowest && value <= setting.highest;
-    setting.set(*this, isInRange ? value : setting.absent);
+    if (setting.get(*this) == setting.absent) setting.Load(*this, stored);
   }
 }
 
 void CFeltsideView::StoreSettings(std::initializer_list<const char*> names) {
   TheFeltsideApp().Profile().Update(kSettingsSection, [&](platform::CProfileSection& stored) {
+    LoadUnreadSettings(stored);
     for (const std::string name : names) {
       const auto* setting =
           std::find_if(Settings::kAll.begin(), Settings::kAll.end(),

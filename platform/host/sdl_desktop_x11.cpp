@@ -4,26 +4,21 @@
 #include <optional>
 
 #include "platform/host/sdl_desktop.h"
+#include "platform/host/sdl_library.h"
 
 namespace platform {
 namespace {
 
 /// What is needed of the X library, which SDL too loads only where the desktop is one of X.
-class XLibrary {
+class XLibrary : public SdlLibrary {
  public:
-  explicit XLibrary(Display* display)
-      : m_pDisplay(display), m_pLibrary(SDL_LoadObject("libX11.so.6")) {
+  explicit XLibrary(Display* display) : SdlLibrary("libX11.so.6"), m_pDisplay(display) {
     Load(m_pInternAtom, "XInternAtom");
     Load(m_pGetWindowProperty, "XGetWindowProperty");
     Load(m_pGetWindowAttributes, "XGetWindowAttributes");
     Load(m_pDefaultRootWindow, "XDefaultRootWindow");
     Load(m_pFree, "XFree");
   }
-  ~XLibrary() { SDL_UnloadObject(m_pLibrary); }
-  XLibrary(const XLibrary&) = delete;
-  XLibrary& operator=(const XLibrary&) = delete;
-
-  bool IsComplete() const { return m_bComplete; }
 
   /// Window managers are told what happens on the root window. One that has gone may have left its
   /// list of features behind.
@@ -57,17 +52,7 @@ class XLibrary {
   }
 
  private:
-  template <class Function>
-  void Load(Function*& function, const char* name) {
-    function = m_pLibrary == nullptr
-                   ? nullptr
-                   : reinterpret_cast<Function*>(SDL_LoadFunction(m_pLibrary, name));
-    m_bComplete = m_bComplete && function != nullptr;
-  }
-
   Display* m_pDisplay;
-  void* m_pLibrary;
-  bool m_bComplete = true;
   decltype(XInternAtom)* m_pInternAtom = nullptr;
   decltype(XGetWindowProperty)* m_pGetWindowProperty = nullptr;
   decltype(XGetWindowAttributes)* m_pGetWindowAttributes = nullptr;

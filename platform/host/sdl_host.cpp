@@ -11,6 +11,7 @@
 #include "platform/host/help_viewer.h"
 #include "platform/host/profile_folder.h"
 #include "platform/host/sdl_events.h"
+#include "platform/host/sdl_fonts.h"
 #include "platform/host/sdl_video.h"
 #include "platform/host/sdl_window.h"
 
@@ -109,6 +110,7 @@ std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& 
     why = std::string("The window cannot be opened: ") + SDL_GetError();
     return nullptr;
   }
+  SetFontFinder(FindDesktopFont);
   return host;
 }
 

@@ -128,7 +128,7 @@ CProfileSection CFileProfile::Read(const std::string& section) {
     refusal = kNoMemory;
   }
   Tell(Named() + " cannot be read: " + refusal + ". The defaults hold.");
-  return {};
+  return CProfileSection::Unread();
 }
 
 bool CFileProfile::Update(const std::string& section, const Change& change) {

@@ -5,6 +5,12 @@
 
 namespace platform {
 
+CProfileSection CProfileSection::Unread() {
+  CProfileSection section;
+  section.m_bRead = false;
+  return section;
+}
+
 int CProfileSection::GetInt(const std::string& entry, int absent) const {
   const Value* value = Find(entry);
   return value == nullptr ? absent : value->number.value_or(absent);

@@ -22,6 +22,10 @@ class CProfileSection {
 
   CProfileSection() = default;
   explicit CProfileSection(std::map<std::string, Value> stored) : m_values(std::move(stored)) {}
+  /// Without values, as those that are stored could not be read.
+  static CProfileSection Unread();
+
+  bool WasRead() const { return m_bRead; }
 
   // A missing value, or one of the other type, reads as the default.
   int GetInt(const std::string& entry, int absent) const;
@@ -37,6 +41,7 @@ class CProfileSection {
   const Value* Find(const std::string& entry) const;
   void Put(const std::string& entry, const Value& value);
 
+  bool m_bRead = true;
   std::map<std::string, Value> m_values;
   std::vector<std::pair<std::string, Value>> m_changes;
 };
