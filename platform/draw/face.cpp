@@ -38,11 +38,6 @@ int Nearest(FT_Pos parts) { return static_cast<int>((parts + kPartsOfPixel / 2) 
 int Ceiling(FT_Pos parts) { return static_cast<int>((parts + kPartsOfPixel - 1) >> 6); }
 short Short(int pixels) { return static_cast<short>(pixels); }
 
-TypeMemory& Memory() {
-  static TypeMemory memory;
-  return memory;
-}
-
 /// The ink of one row of a bitmap of bits, whose left edge stands so far from the pen.
 void AddRow(Glyph& glyph, int y, int left, const unsigned char* bits, int width) {
   const auto isInk = [&](int x) { return x < width && (bits[x / 8] & 0x80 >> x % 8) != 0; };
@@ -107,7 +102,7 @@ class Face::OpenFace {
 
  private:
   bool OpenLibrary() {
-    if (FT_New_Library(Memory().Handle(), &m_library) != 0) return false;
+    if (FT_New_Library(static_cast<FT_Memory>(TypeMemory()), &m_library) != 0) return false;
     FT_Add_Default_Modules(m_library);
     return true;
   }
@@ -142,7 +137,7 @@ Face::OpenFace* Face::Open() {
 }
 
 bool Face::CloseIfShort() {
-  if (!Memory().WasShort()) return false;
+  if (!TypeMemoryWasShort()) return false;
   m_pOpenFace.reset();
   return true;
 }

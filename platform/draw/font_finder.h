@@ -13,8 +13,8 @@ struct FontFile {
 /// Answers which file has a face with a character, and what has none is found out by looking.
 using FontFinder = FontFile (*)(char32_t character);
 
-/// Sets who is asked for the characters that the type family lacks; each is asked for once per font.
-/// Without a finder there are none.
+/// Sets who is asked for the characters that the type family lacks; each is asked for once per
+/// font. Without a finder there are none.
 void SetFontFinder(FontFinder finder);
 FontFile FindFontFile(char32_t character);
 

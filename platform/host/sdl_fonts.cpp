@@ -9,8 +9,8 @@
 namespace platform {
 namespace {
 
-/// What is needed of fontconfig, by the names and types that it gives to programs. They are said here
-/// so that it need not be there to build with, either.
+/// What is needed of fontconfig, by the names and types that it gives to programs. They are said
+/// here so that it need not be there to build with, either.
 class FontLibrary : public SdlLibrary {
  public:
   FontLibrary() : SdlLibrary("libfontconfig.so.1") {
@@ -61,8 +61,7 @@ FontFile FindDesktopFont(char32_t character) {
   // Letters are drawn from outlines, in one colour.
   std::array<char, 80> description{};
   std::snprintf(description.data(), description.size(),
-                "sans-serif:charset=%x:outline=true:color=false",
-                static_cast<unsigned>(character));
+                "sans-serif:charset=%x:outline=true:color=false", static_cast<unsigned>(character));
   return library.Match(description.data());
 }
 
