@@ -21,7 +21,13 @@ class FontLibrary : public SdlLibrary {
     Load(m_pPatternGetString, "FcPatternGetString");
     Load(m_pPatternGetInteger, "FcPatternGetInteger");
     Load(m_pPatternDestroy, "FcPatternDestroy");
+    Load(m_pFini, "FcFini");
   }
+  ~FontLibrary() {
+    if (IsComplete()) m_pFini();
+  }
+  FontLibrary(const FontLibrary&) = delete;
+  FontLibrary& operator=(const FontLibrary&) = delete;
 
   FontFile Match(const char* description) const {
     const auto wanted = Own(m_pNameParse(description));
@@ -51,6 +57,7 @@ class FontLibrary : public SdlLibrary {
   int (*m_pPatternGetString)(const Pattern*, const char*, int, const char**) = nullptr;
   int (*m_pPatternGetInteger)(const Pattern*, const char*, int, int*) = nullptr;
   void (*m_pPatternDestroy)(Pattern*) = nullptr;
+  void (*m_pFini)() = nullptr;
 };
 
 }  // namespace

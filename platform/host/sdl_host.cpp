@@ -24,7 +24,12 @@ class SdlHost : public Host {
       : m_pVideo(std::move(video)),
         m_window(options.frameSize),
         m_events(m_window),
-        m_arrHelpFolders(options.helpFolders) {}
+        m_arrHelpFolders(options.helpFolders) {
+    SetFontFinder(FindDesktopFont);
+  }
+  ~SdlHost() override { SetFontFinder(nullptr); }
+  SdlHost(const SdlHost&) = delete;
+  SdlHost& operator=(const SdlHost&) = delete;
 
   bool IsReady() const { return m_window.IsOpen(); }
 
@@ -110,7 +115,6 @@ std::unique_ptr<Host> CreateSdlHost(const SdlHostOptions& options, std::string& 
     why = std::string("The window cannot be opened: ") + SDL_GetError();
     return nullptr;
   }
-  SetFontFinder(FindDesktopFont);
   return host;
 }
 

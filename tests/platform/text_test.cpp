@@ -62,7 +62,7 @@ TEST(Text, TakesFromASecondFaceOnlyWhatTheFirstLacks) {
     asked += character;
     return FontFile{character == U'\uF004' ? FELTSIDE_SECOND_FACE : "/no/such/face", 0};
   };
-  const CBitmap box = RenderText({13}, "\uF005");
+  const CBitmap box = RenderText({13}, "\u05D0");
   SetFontFinder(find);
   const CBitmap letter = RenderText({13}, "\uF004");
   EXPECT_EQ(RenderText({13}, "\uF006"), box);

@@ -73,7 +73,7 @@ TEST(Settings, AreStoredEachAsItsOwn) {
 
 TEST(Settings, AreNotLostToTheDefaultsOfAFileThatCouldNotBeRead) {
   Stylus stylus;
-  std::filesystem::create_directory(stylus.ProfileFile());
+  std::filesystem::create_directories(stylus.ProfileFile());
   stylus.Send("key Ctrl+N");
   stylus.Send("press 1");  // the box that tells
   std::filesystem::remove(stylus.ProfileFile());
