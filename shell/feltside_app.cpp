@@ -60,7 +60,9 @@ int CFeltsideApp::ExitInstance() {
 }
 
 const platform::CProfileSection& CFeltsideApp::ReadSettings() {
-  m_mapStored = Profile().Read();
+  const auto stored = Profile().Read();
+  m_bReadSettings = stored.has_value();
+  m_mapStored = stored.value_or(platform::CProfileSections());
   return m_mapStored[kSettingsSection];
 }
 

@@ -32,6 +32,8 @@ class CFeltsideApp : public platform::CApplication {
   /// Reads what is stored now, and returns the settings and high scores of it; they are good until
   /// the next call.
   const platform::CProfileSection& ReadSettings();
+  /// Whether that could be read.
+  bool HasReadSettings() const { return m_bReadSettings; }
 
  protected:
   bool InitInstance() override;
@@ -52,6 +54,7 @@ class CFeltsideApp : public platform::CApplication {
   void TakeOver(const std::vector<std::string>& stored);
 
   platform::CProfileSections m_mapStored;  ///< as last read
+  bool m_bReadSettings = false;
   std::vector<std::string> m_arrHighScores;
   std::vector<std::string> m_arrLoadedScores;           ///< as they were last seen stored
   std::vector<std::pair<std::string, int>> m_arrAdded;  ///< and not stored yet

@@ -5,6 +5,7 @@
 #include <array>
 #include <limits>
 #include <type_traits>
+#include <utility>
 
 #include "shell/feltside_app.h"
 #include "table/feltside_view.h"
@@ -32,6 +33,11 @@ struct CFeltsideView::Settings {
     int absent;           ///< the default
     int (*get)(const View&);
     void (*set)(View&, int);
+
+    void Load(View& view, const platform::CProfileSection& stored) const {
+      const int value = stored.GetInt(name, absent);
+      set(view, value >= lowest && value <= highest ? value : absent);
+    }
   };
 
   // Of a member that is named by its path: of a member of the view, or of a member of one.
@@ -79,15 +85,20 @@ constexpr std::array<CFeltsideView::Settings::Entry, kSettingCount> CFeltsideVie
 
 void CFeltsideView::LoadSettings() {
   const platform::CProfileSection& stored = TheFeltsideApp().ReadSettings();
+  for (const Settings::Entry& setting : Settings::kAll) setting.Load(*this, stored);
+  m_bSettingsUnread = TheFeltsideApp().HasReadSettings() ? 0 : 1;
+}
+
+void CFeltsideView::LoadUnreadSettings(const platform::CProfileSection& stored) {
+  if (std::exchange(m_bSettingsUnread, 0) == 0) return;
   for (const Settings::Entry& setting : Settings::kAll) {
-    const int value = stored.GetInt(setting.name, setting.absent);
-    const bool isInRange = value >= setting.lowest && value <= setting.highest;
-    setting.set(*this, isInRange ? value : setting.absent);
+    if (setting.get(*this) == setting.absent) setting.Load(*this, stored);
   }
 }
 
 void CFeltsideView::StoreSettings(std::initializer_list<Setting> settings) {
   TheFeltsideApp().Profile().Update(kSettingsSection, [&](platform::CProfileSection& stored) {
+    LoadUnreadSettings(stored);
     for (const Setting setting : settings) {
       const Settings::Entry& entry = Settings::kAll[setting];
       stored.Set(entry.name, entry.get(*this));

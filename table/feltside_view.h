@@ -12,6 +12,10 @@
 #include "platform/window/view.h"
 #include "render/table_layout.h"
 
+namespace platform {
+class CProfileSection;
+}
+
 namespace feltside {
 
 enum Setting : int;
@@ -213,6 +217,9 @@ class CFeltsideView : public platform::CView {
   struct Settings;
   /// While a hand is played its game stays selected, whatever the profile says.
   void LoadSettings();
+  /// Catches up on settings that could not be read in their time: none is to be lost to a default
+  /// that stood in for it. What was chosen since stands.
+  void LoadUnreadSettings(const platform::CProfileSection& stored);
   /// Stores these in one step, in this order.
   void StoreSettings(std::initializer_list<Setting> settings);
   /// Sets the dealer's pause by a speed, 0 slow to 2 fast; any other leaves it as it was.
@@ -259,6 +266,7 @@ class CFeltsideView : public platform::CView {
   int m_nBet = 5;             ///< dollars; a multiple of 5, at least 5
   int m_nDealerDelay = 1000;  ///< milliseconds between the dealer's cards: 2000, 1000 or 200
   int m_bHandInProgress = 0;  ///< until the dealer's play begins; in video poker until the draw
+  int m_bSettingsUnread = 0;  ///< the defaults stand in for what could not be read
   int m_bUseHighScores = 1;
   int m_bPlayingSplit = 0;
   int m_bFancyBlackjack = 1;

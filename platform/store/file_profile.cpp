@@ -100,7 +100,7 @@ class CFileProfile : public CProfile {
  public:
   explicit CFileProfile(const fs::path& file) : m_file(TargetOf(file)) {}
 
-  CProfileSections Read() override;
+  std::optional<CProfileSections> Read() override;
   bool Update(const std::string& section, const Change& change) override;
 
  private:
@@ -115,7 +115,7 @@ class CFileProfile : public CProfile {
   fs::path m_file;
 };
 
-CProfileSections CFileProfile::Read() {
+std::optional<CProfileSections> CFileProfile::Read() {
   if (m_file.empty()) {
     Tell(kNoHome);
     return {};
@@ -123,13 +123,13 @@ CProfileSections CFileProfile::Read() {
   std::string refusal;
   try {
     Contents contents = ReadUnlocked();
-    if (contents.refusal.empty()) return contents.sections.value_or(CProfileSections());
+    if (contents.refusal.empty()) return contents.sections;
     refusal = contents.refusal;
   } catch (const std::bad_alloc&) {
     refusal = kNoMemory;
   }
   Tell(Named() + " cannot be read: " + refusal + ". The defaults hold.");
-  return {};
+  return std::nullopt;
 }
 
 bool CFileProfile::Update(const std::string& section, const Change& change) {

@@ -57,8 +57,9 @@ class CProfile {
   CProfile(const CProfile&) = delete;
   CProfile& operator=(const CProfile&) = delete;
 
-  /// All that is stored at this moment. A store that cannot be understood is set aside by this.
-  virtual CProfileSections Read() = 0;
+  /// All that is stored at this moment; nothing where it cannot be read. A store that cannot be
+  /// understood is set aside by this, and empty then.
+  virtual std::optional<CProfileSections> Read() = 0;
 
   using Change = std::function<void(CProfileSection&)>;
   /// Changes values of a section in one step: `change` is given the section as it is stored and
