@@ -34,7 +34,7 @@ OURS = [
     ("stylus/", GAME + PLATFORM + ("stylus/",)),
     ("tests/", GAME + PLATFORM + ("stylus/", "tests/")),
     ("bench/", GAME + PLATFORM + ("stylus/", "bench/")),
-    ("fuzz/", GAME + PLATFORM + ("stylus/", "fuzz/")),
+    ("fuzz/", GAME + PLATFORM + ("stylus/", "fuzz/", "tests/")),
 ]
 
 SDL = r"SDL.*"
@@ -52,7 +52,8 @@ LIBRARIES = [
     (r"tests/platform/sdl_\w+\.cpp", SDL),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|dlfcn\\.h"),
-    (r"fuzz/.*", SYSTEM),
+    (r"fuzz/profile\.cpp", r"toml\+\+/.*"),
+    (r"fuzz/.*", f"{JSON}|{SYSTEM}"),
 ]
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
@@ -118,7 +119,8 @@ class Checker:
     def check_names(self, path, text):
         """Even by name the libraries are known to the layer alone, and to what the game is measured
         against."""
-        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|(bench/|tests/platform/sdl_)\w+\.cpp",
+        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|(bench/|tests/platform/sdl_)\w+\.cpp|"
+                        r"fuzz/profile\.cpp",
                         path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
