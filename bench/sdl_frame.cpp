@@ -41,10 +41,19 @@ Surface SurfaceOf(const CBitmap& bitmap) {
   return surface;
 }
 
-/// The columns from one on.
-CBitmap Columns(const CBitmap& text, int from) {
-  CBitmap part = CBitmap::SeeThrough({text.GetSize().width - from, text.GetSize().height});
-  platform::CSurface(part).DrawIcon({-from, 0}, text);
+/// What a text has more than its beginning, from its first column with ink on, which is told.
+CBitmap LastLetter(const CBitmap& text, const CBitmap& beginning, int& column) {
+  CBitmap letter = text;
+  column = text.GetSize().width;
+  for (int y = 0; y < text.GetSize().height; ++y) {
+    for (int x = text.GetSize().width - 1; x >= 0; --x) {
+      const Point p{x, y};
+      if (beginning.Bounds().Contains(p) && platform::IsOpaque(beginning.At(p))) letter.At(p) = 0;
+      if (platform::IsOpaque(letter.At(p))) column = std::min(column, x);
+    }
+  }
+  CBitmap part = CBitmap::SeeThrough({text.GetSize().width - column, text.GetSize().height});
+  platform::CSurface(part).DrawIcon({-column, 0}, letter);
   return part;
 }
 
@@ -70,16 +79,16 @@ void CSdlFrame::Add(std::vector<Blit>& blits, const PlacedPicture& picture) {
   blits.push_back({SurfaceOf(bitmap), picture.at});
 }
 
-/// Each letter is what the text shows more than without it.
 void CSdlFrame::AddLetters(const PlacedText& text) {
-  int drawn = 0;
+  CBitmap before;
   for (std::size_t end = 0; end < text.text.size();) {
     end = platform::NextLetter(text.text, end);
     const CBitmap now = platform::RenderText(text.font, text.text.substr(0, end));
-    if (now.GetSize().width == drawn || text.text[end - 1] == ' ') continue;
-    m_blits.push_back(
-        {SurfaceOf(Colored(Columns(now, drawn), text.color)), text.at + Point{drawn, 0}});
-    drawn = now.GetSize().width;
+    int column = 0;
+    const CBitmap letter = LastLetter(now, before, column);
+    before = now;
+    if (letter.GetSize().width == 0) continue;  // a blank
+    m_blits.push_back({SurfaceOf(Colored(letter, text.color)), text.at + Point{column, 0}});
   }
 }
 
@@ -89,7 +98,7 @@ void CSdlFrame::Draw() const {
     SDL_Rect at{blit.at.x, blit.at.y, 0, 0};
     SDL_BlitSurface(blit.source.get(), nullptr, frame.get(), &at);
   };
-  SDL_FillRect(frame.get(), nullptr, SDL_MapRGB(frame->format, 0, 155, 0));
+  if (!m_ground.empty()) SDL_FillRect(frame.get(), nullptr, SDL_MapRGB(frame->format, 0, 155, 0));
   std::for_each(m_ground.begin(), m_ground.end(), lay);
   for (const PlacedFill& fill : m_fills) {
     const SDL_Rect rect{fill.rect.left, fill.rect.top, fill.rect.Width(), fill.rect.Height()};
