@@ -3,10 +3,10 @@
 
     tools/mutate.py [--count N] [--seed N] [FOLDER...]
 
-Each fault changes one line of a source of these folders (all of the game and its layer), at random by
-the seed. It is built and tested in a copy below build/mutants/, without sanitizers. Prints what
+Each fault changes one line of a source of these folders (all of the game and its layer), at random
+by the seed. It is built and tested in a copy below build/mutants/, without sanitizers. Prints what
 survives, and at last the score of each folder. A survivor is either a test that is missing or a
-fault that nobody can see, such as a longer reservation of memory: that is for a person to say.
+fault that nobody can see: that is for a person to say.
 """
 
 import argparse
@@ -32,7 +32,7 @@ SWAPS = [("==", "!="), ("<=", "<"), (">=", ">"), ("&&", "||"), ("||", "&&"), ("t
          (" += ", " -= "), (" -= ", " += "), ("++", "--"), ("std::min", "std::max"),
          ("std::max", "std::min"), (".left", ".right"), (".top", ".bottom"), ("width", "height"),
          (".x", ".y"), ("return !", "return "), ("if (", "if (!("), ("begin()", "rbegin()")]
-STATEMENT = re.compile(r"^\s+(?!return|break|continue|case|using|const |auto |static |std::string \w+;)"
+STATEMENT = re.compile(r"^\s+(?!return|break|continue|case|using|const |auto |static )"
                        r"[\w:.\->()*\[\]]+(\(.*\)| [+\-|&]?= .*|\+\+|--);$")
 NUMBER = re.compile(r"(?<![\w.])\d+(?![\w.'])")
 
@@ -53,7 +53,8 @@ def faults_of(line):
             if new == "if (!(":  # to the end of the condition
                 end = code.rfind(") ") if ") " in code else -1
                 if end > 0:
-                    faults.append(code[:match.start()] + new + code[match.end():end] + ")" + code[end:])
+                    faults.append(code[:match.start()] + new + code[match.end():end] + ")" +
+                                  code[end:])
             else:
                 put(*match.span(), new)
     for match in NUMBER.finditer(code):
@@ -112,8 +113,9 @@ def try_out(path, number, fault):
     if build():
         outcome = "caught" if notice() else "survived"
     file.write_text(sound, encoding="utf-8")
-    shown = "" if outcome == "not compiled" else f": {was.strip()}  =>  {fault.strip() or '(nothing)'}"
-    print(f"{outcome} {path}:{number + 1}{shown}", flush=True)
+    if outcome != "not compiled":
+        print(f"{outcome} {path}:{number + 1}: {was.strip()}  =>  {fault.strip() or '(nothing)'}",
+              flush=True)
     return outcome
 
 
