@@ -4,11 +4,12 @@
     tools/break_store.py BUILD_FOLDER [--short] [--kills N] [--seed N]
 
 Plays one session of feltside-stylus, which changes all settings and enters a score, again and
-again: each system call by which files are kept fails in turn, and each allocation; games are killed at
-random moments, two at a time on one file; the file system is full, read-only and slow. Prints what
-came of it. "Lost" is what stood in the file before and is not whole there after; "silent" is what
-was not stored without a word to the player. Ends with 1 where there was any. With --short, some of
-all. Before it: cmake --build BUILD_FOLDER --target feltside-stylus failing-calls
+again: each system call by which files are kept fails in turn, and each allocation; games are
+killed at random moments, two at a time on one file; the file system is full, read-only and slow.
+Prints what came of it. "Lost" is what stood in the file before and is not whole there after;
+"silent" is what was not stored without a word to the player. Ends with 1 where there was any.
+With --short, some of all.
+Before it: cmake --build BUILD_FOLDER --target feltside-stylus failing-calls
 """
 
 import argparse
@@ -153,34 +154,46 @@ class Breaker:
                 print(f"{what}: cannot be tried here: {done.stderr.strip()}")
 
     def start(self, store, steps):
-        """A game that changes one setting after another."""
+        """A game that changes one setting after another, at its first answer."""
         game = subprocess.Popen([self.game], stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                                 stderr=subprocess.DEVNULL, text=True, bufsize=1 << 20,
                                 env=self.environment(store.folder.name, {}))
-        for command, number, item in steps:
-            game.stdin.write(f"command {command}\nselect {number} {item}\npress 1\n")
+        for step in steps:
+            game.stdin.write("\n".join(step) + "\n")
         game.stdin.flush()
+        game.first_answer = game.stdout.readline()
         return game
 
     def kill_two(self, chance):
-        decks = [i % 3 for i in range(200)]
-        backs = [i % 12 for i in range(200)]
+        decks = [number % 3 for number in range(200)]
+        backs = [number % 12 for number in range(200)]
+        # A confirmed game setup deals a hand, which must be over before the next.
+        game_steps = [["command game-setup", f"select 1009 {item}", "press 1", "key N",
+                       "command stand"] for item in decks]
+        table_steps = [["command table-setup", f"select 1005 {item}", "press 1"] for item in backs]
         with Store() as store:
-            games = [self.start(store, [("game-setup", 1009, item) for item in decks]),
-                     self.start(store, [("table-setup", 1005, item) for item in backs])]
-            kept = []
+            games = [self.start(store, game_steps), self.start(store, table_steps)]
             for game in chance.sample(games, 2):
-                time.sleep(chance.uniform(0, 0.06))
+                time.sleep(chance.uniform(0, 0.05))
                 game.send_signal(signal.SIGKILL)
-            for game, name, values in zip(games, ("NUMDECKS", "CARDBACK"),
-                                          (decks, [54 + item for item in backs])):
-                steps = len(game.communicate()[0].splitlines()) // 3
-                settings = store.settings()
-                kept.append(settings is not None and (
-                    steps == 0 and name not in settings
-                    or settings.get(name) in values[max(steps - 1, 0):steps + 1]))
-            for is_kept in kept:
-                self.note("killed, one of two", "stored" if is_kept else "lost")
+            answers = [game.first_answer + game.communicate()[0] for game in games]
+            settings = store.settings()
+            self.judge_killed(settings, "NUMDECKS", decks, answers[0], len(game_steps[0]))
+            self.judge_killed(settings, "CARDBACK", [54 + item for item in backs], answers[1],
+                              len(table_steps[0]))
+
+    def judge_killed(self, settings, name, values, answers, step_length):
+        """The last value that was answered for is kept, or the one after it."""
+        answered = len(answers.splitlines())
+        steps = answered // step_length + (answered % step_length >= 3)
+        expected = [*values[max(steps - 1, 0):steps + 1], *([None] if steps == 0 else [])]
+        outcome = "lost"
+        if settings is not None and settings.get(name) in expected:
+            outcome = "stored"
+        elif settings is not None and was_told(answers):
+            outcome = "told"
+        self.note("killed, one of two", outcome,
+                  f"{name} = {settings and settings.get(name)} after {steps} steps")
 
     def report(self):
         columns = ("stored", "told", "ended", "lost", "silent")
