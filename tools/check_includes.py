@@ -36,7 +36,7 @@ OURS = [
     ("stylus/", GAME + PLATFORM + ("stylus/",)),
     ("tests/", GAME + PLATFORM + ("stylus/", "tests/")),
     ("bench/", GAME + PLATFORM + ("stylus/", "bench/")),
-    ("fuzz/", GAME + PLATFORM + ("stylus/", "fuzz/")),
+    ("fuzz/", GAME + PLATFORM + ("stylus/", "fuzz/", "tests/")),
 ]
 
 SDL = r"SDL.*"
@@ -55,8 +55,9 @@ LIBRARIES = [
     (r"stylus/.*", JSON),
     (r"tests/platform/sdl_\w+\.cpp", SDL),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
-    (r"bench/.*", f"{SDL}|dlfcn\\.h"),
-    (r"fuzz/.*", SYSTEM),
+    (r"bench/.*", f"{SDL}|{SYSTEM}|dlfcn\\.h|benchmark/benchmark\\.h"),
+    (r"fuzz/profile\.cpp", r"toml\+\+/.*"),
+    (r"fuzz/.*", f"{JSON}|{SYSTEM}|dlfcn\\.h"),
 ]
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
@@ -123,8 +124,8 @@ class Checker:
     def check_names(self, path, text):
         """Even by name the libraries are known to the layer alone, and to what the game is measured
         against."""
-        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|(bench/|tests/platform/sdl_)\w+\.cpp",
-                        path):
+        if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|bench/\w+\.(cpp|h)|"
+                        r"(tests/platform/sdl_\w+|fuzz/profile)\.cpp", path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
             if match := LIBRARY_NAME.search(line):

@@ -82,6 +82,8 @@ void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt
 
 void CSurface::StretchBlt(const Rect& to, const CBitmap& source, const Rect& from) {
   if (to.IsEmpty()) return;
+  const Size size{from.Width(), from.Height()};
+  if (to == RectAt(to.TopLeft(), size)) return BitBlt(to.TopLeft(), size, source, from.TopLeft());
   EachPixel(to, [&](Pixel& target, Point p) {
     const Point sample{from.left + (p.x - to.left) * from.Width() / to.Width(),
                        from.top + (p.y - to.top) * from.Height() / to.Height()};
