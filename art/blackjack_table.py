@@ -3,8 +3,9 @@
 The dealer stands at the top, so all arcs have their centre above the picture. The player box
 hides (12, 92)-(120, 176); the dealer's cards lie from (79, 10), the player's from (79, 217), and
 those of a split from (19, 217) and (139, 217), each with a total some pixels to the right of where
-five cards end; the strategy button stands on the medallion. Nothing is darker than INK_LIMIT
-allows, so that dark red and black text keeps its contrast wherever it falls.
+five cards end, the last one up to (226, 257); the strategy button stands on the medallion. Nothing
+is darker than INK_LIMIT allows, so that dark red and black text keeps its contrast wherever it
+falls.
 """
 
 import math
@@ -17,24 +18,23 @@ WIDTH, HEIGHT = 240, 268
 # 255 - 226: the darkest step of the paper ramp.
 INK_LIMIT = 29
 
-_ARC_CENTRE = (120, -136)
+_ARC_CENTRE = (120, -800)
 _TEXT = "BLACKJACK PAYS 3 TO 2"
-_TEXT_TOP = 204.5
+_TEXT_TOP = 871
 _TEXT_UNIT = 10 / 6
 _TEXT_GAP = 1.9
 _TEXT_BLANK = 2.6
 _TEXT_STROKE = 0.58
 
 _MEDALLION = (180, 118)
-# Dealer and player each have the whole end of the table behind a line as their field: cards, names
-# and totals lie on it, those of one hand and those of two.
-_DEALERS_LINE, _PLAYERS_LINE = 195, 321
-_FIELD_INK, _CLOTH_INK = 4, 8
-_NOTCH = 10
-_INSIDE_FRAME = 6
-# In each field a row of suits, above the player's totals and below the dealer's.
-_SUIT_ROWS = (38, 230)
-_SUITS_IN_ROW, _SUIT_STEP = 8, 15
+# Radii: the band with the inscription, and the line that ends the player's field.
+_BAND_TOP, _PLAYERS_LINE = 862, 986
+_CLOTH_INK = 8
+_INSIDE_FRAME = 4
+# Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie beside
+# them.
+_TRAYS = ((10, 6, 230, 55), (10, 213, 230, 262))
+_TRAY_INK = 3
 
 
 class Paper:
@@ -71,19 +71,21 @@ def _arc_radius(x, y):
 
 def _arc(inner, outer):
     """A line across the table, from frame to frame."""
-    within_frame = _notched(_INSIDE_FRAME)
+    within_frame = _framed(_INSIDE_FRAME)
     return lambda x, y: inner <= _arc_radius(x, y) < outer and within_frame(x, y)
 
 
-def _notched(inset):
-    """The whole picture less an inset, a quarter circle cut out of each corner.
-
-    The circles are small, as the total of the right hand of a split stands beside the lower one.
-    """
+def _rounded(left, top, right, bottom, radius):
     def inside(x, y):
-        dx, dy = min(x, WIDTH - x), min(y, HEIGHT - y)
-        return min(dx, dy) >= inset and math.hypot(dx, dy) >= _NOTCH + inset
+        dx = max(left + radius - x, x - right + radius, 0)
+        dy = max(top + radius - y, y - bottom + radius, 0)
+        return math.hypot(dx, dy) < radius
     return inside
+
+
+def _framed(inset):
+    """The whole picture less an inset, with round corners."""
+    return _rounded(inset, inset, WIDTH - inset, HEIGHT - inset, 10 - inset)
 
 
 def _outline(outer, inner):
@@ -118,9 +120,9 @@ def _lay_letter(paper, letter, place, width):
 def _bare(x, y):
     """Whether a small suit of the cloth has room at a point."""
     radius = _arc_radius(x, y)
-    if radius < 231 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
+    if radius < _BAND_TOP + 36 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
         return False
-    return 14 < x < WIDTH - 14 and y < _SUIT_ROWS[1] - 12
+    return 14 < x < WIDTH - 14 and y < _TRAYS[1][1] - 8
 
 
 def _lay_cloth(paper):
@@ -147,34 +149,29 @@ def _lay_medallion(paper):
     paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
 
 
-def _lay_fields(paper):
-    inside = _notched(_INSIDE_FRAME)
-    paper.lay(lambda x, y: inside(x, y) and not _DEALERS_LINE <= _arc_radius(x, y) < _PLAYERS_LINE,
-              _FIELD_INK)
-    for y in _SUIT_ROWS:
-        for place in range(_SUITS_IN_ROW):
-            x = WIDTH / 2 + _SUIT_STEP * (place - (_SUITS_IN_ROW - 1) / 2)
-            paper.lay_placed(shapes.SUITS[place % 4], x, y, 6, 16)
+def _lay_tray(paper, tray):
+    left, top, right, bottom = tray
+    outer = _rounded(left, top, right, bottom, 5)
+    paper.lay(outer, _TRAY_INK, tray)
+    paper.lay(_outline(outer, _rounded(left + 1, top + 1, right - 1, bottom - 1, 4)), INK_LIMIT, tray)
 
 
 def _lay_frame(paper):
-    paper.lay(_outline(_notched(2), _notched(3)), INK_LIMIT)
-    paper.lay(_outline(_notched(5), _notched(_INSIDE_FRAME)), 18)
-    for suit, x, y in ((shapes.spade, 6, 6), (shapes.heart, WIDTH - 6, 6),
-                       (shapes.diamond, 6, HEIGHT - 6), (shapes.club, WIDTH - 6, HEIGHT - 6)):
-        paper.lay_placed(suit, x, y, 4.5, 24)
+    paper.lay(_outline(_framed(1), _framed(2)), INK_LIMIT)
+    paper.lay(_outline(_framed(3), _framed(_INSIDE_FRAME)), 18)
 
 
 def blackjack_table():
     paper = Paper()
     _lay_cloth(paper)
-    for inner, outer, ink in ((195, 196, 18), (197.5, 199, INK_LIMIT),
-                              (220, 221.5, INK_LIMIT), (223, 224, 18),
-                              (319, 320.2, 22), (322, 323, 14)):
-        paper.lay(_arc(inner, outer), ink)
+    for offset, width, ink in ((0, 1, 18), (2.5, 1.5, INK_LIMIT), (25, 1.5, INK_LIMIT), (28, 1, 18)):
+        paper.lay(_arc(_BAND_TOP + offset, _BAND_TOP + offset + width), ink)
+    for offset, width, ink in ((-2, 1.2, 22), (1, 1, 14)):
+        paper.lay(_arc(_PLAYERS_LINE + offset, _PLAYERS_LINE + offset + width), ink)
     _lay_inscription(paper)
     _lay_medallion(paper)
-    _lay_fields(paper)
+    for tray in _TRAYS:
+        _lay_tray(paper, tray)
     _lay_frame(paper)
     return paper.canvas()
 

@@ -17,11 +17,11 @@ SEEN_HEIGHT = 268
 
 # Where the game puts things: left, top, right, bottom.
 BUTTON = (70, 180, 155, 215)
-# The panels reach from one side post to the other, as the longest result ends eight columns before
-# the right edge of the picture. LEFT and RIGHT are those of what is inside their frames.
-LEFT, RIGHT = 3, WIDTH - 3
-WALLET = (LEFT, 230, 116, 254)
-RESULT = (WIDTH - 116, 230, RIGHT, 254)
+# All panels have the same edges: as far out as the longest result needs, which ends eight columns
+# before the right edge of the picture. LEFT and RIGHT are those of what is inside their frames.
+LEFT, RIGHT = 4, WIDTH - 4
+WALLET = (LEFT, 230, 114, 254)
+RESULT = (WIDTH - 114, 230, RIGHT, 254)
 CARDS = [(x, 114, x + 29, 155) for x in (40, 73, 106, 139, 172)]
 
 PAYS = (
@@ -70,14 +70,12 @@ _MIX = ((0, 8, 2, 10), (12, 4, 14, 6), (3, 11, 1, 9), (15, 7, 13, 5))
 
 
 def cabinet(picture):
-    """The body, lit from above, and the desk that carries the button and the panels."""
+    """The body, lighter at the top, the desk for the button and the panels, a rim around all."""
     shaded(picture, (0, 0, WIDTH, HEIGHT), 8, 4)
-    for inset, light, dark in ((0, 14, 2), (1, 11, 3)):
-        bevel(picture, (inset, inset, WIDTH - inset, SEEN_HEIGHT - inset),
-              night(light), night(dark))
-    shaded(picture, (2, 167, WIDTH - 2, SEEN_HEIGHT - 2), 9, 6)
-    picture.rect(2, 165, WIDTH - 2, 166, night(2))
-    picture.rect(2, 166, WIDTH - 2, 167, night(14))
+    shaded(picture, (1, 167, WIDTH - 1, SEEN_HEIGHT - 1), 9, 6)
+    picture.rect(1, 165, WIDTH - 1, 166, night(2))
+    picture.rect(1, 166, WIDTH - 1, 167, night(14))
+    bevel(picture, (0, 0, WIDTH, SEEN_HEIGHT), night(14), night(14))
 
 
 def soft_suit(picture, shape, x, y, half_height, ramp):
@@ -103,9 +101,9 @@ def marquee(picture):
     box = (LEFT, 7, RIGHT, 37)
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
-    for place in range(29):
+    for place in range(28):
         for y in (top + 1, bottom - 4):
-            bulb(picture, left + 4 + 8 * place, y, (place + (y > 20)) % 2 == 0)
+            bulb(picture, left + 6 + 8 * place, y, (place + (y > 20)) % 2 == 0)
     BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
     BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
     nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
@@ -179,20 +177,20 @@ def desk(picture):
         picture.rect(x + 9, y + 7, x + chips.WIDTH + 5, y + 11, night(5))
     chips.stack(picture, 12, 198, 5, chips.BLUE)
     chips.stack(picture, 36, 202, 3, chips.GOLD)
-    plate = (171, 180, 231, 215)
+    plate = (174, 180, RIGHT - 1, 215)
     bevel(picture, grown(plate, 2), night(13), night(2))
     bevel(picture, grown(plate, 1), night(11), night(3))
     shaded(picture, plate, 9, 6)
-    bevel(picture, (180, 186, 188, 209), night(1), night(12))
-    picture.rect(181, 187, 187, 208, night(4))
-    picture.rect(183, 189, 185, 206, night(0))
-    BOLD.write_centred(picture, 192, 228, 188, "$1", "gold_light")
-    TINY.write_centred(picture, 192, 228, 200, "A DEAL", night(18))
+    bevel(picture, (183, 186, 191, 209), night(1), night(12))
+    picture.rect(184, 187, 190, 208, night(4))
+    picture.rect(186, 189, 188, 206, night(0))
+    BOLD.write_centred(picture, 195, 231, 188, "$1", "gold_light")
+    TINY.write_centred(picture, 195, 231, 200, "A DEAL", night(18))
 
 
 def labels(picture):
     for (left, top, _, _), label in ((WALLET, "WALLET"), (RESULT, "RESULT")):
-        TINY.write(picture, left + 5, top - 9, label, night(18))
+        TINY.write(picture, left, top - 9, label, night(18))
 
 
 def poker_table():

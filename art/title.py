@@ -16,8 +16,10 @@ _FELT = (48, 83.5, 40, 21)
 _RAIL = 6
 _RAIL_DEPTH = 4
 
-_CARD_WIDTH, _CARD_HEIGHT = 34, 48
-_LEAN = 7
+# Half a card's width and height in units of its lean, how much its corners lack in them, and how
+# many pixels it reaches from its middle. A pixel has as many of the units as the root of 17 says.
+_HALF_ACROSS, _HALF_ALONG, _BLUNT = 72, 97, 5
+_REACH = 30
 _SIGNS = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "title.txt")
 
 
@@ -57,61 +59,68 @@ def felt_colour(dx, dy):
 
 
 class LeaningCard:
-    """A large card that leans by a pixel in so many, to the left (below 0) or to the right.
+    """A large card that leans by a pixel in four, to the left (-1) or to the right (1).
 
-    Its edges lean in even steps; what is drawn on it stands upright, as a sign of few pixels would
-    be torn by the steps.
+    Its middle is (0, 0). Whole numbers along and across the lean say what belongs to it, so every
+    edge is a regular stair.
     """
 
     def __init__(self, lean):
         self._lean = lean
-        self._width = _CARD_WIDTH + (_CARD_HEIGHT - 1) // abs(lean)
-        self.canvas = Canvas(self._width, _CARD_HEIGHT + (self._width - 1) // abs(lean), "nothing")
-        card = Canvas(_CARD_WIDTH, _CARD_HEIGHT, "ink")
-        card.rect(1, 1, _CARD_WIDTH - 1, _CARD_HEIGHT - 1, "white")
-        for x in (0, _CARD_WIDTH - 1):
-            for y in (0, _CARD_HEIGHT - 1):
-                card.put(x, y, "nothing")
-        self._lay(card)
+        self.canvas = Canvas(2 * _REACH + 1, 2 * _REACH + 1, "nothing")
+        for y in range(-_REACH, _REACH + 1):
+            for x in range(-_REACH, _REACH + 1):
+                if self.holds(x, y):
+                    self.canvas.put(x + _REACH, y + _REACH, "ink" if self._ends(x, y) else "white")
 
-    def _lay(self, flat):
-        """Lays an upright card, its rows and then its columns moved on."""
-        right, step = self._lean > 0, abs(self._lean)
-        for y in range(flat.height):
-            for x in range(flat.width):
-                column = x + (_CARD_HEIGHT - 1 - y if right else y) // step
-                row = y + (column if right else self._width - 1 - column) // step
-                if flat.get(x, y) != "nothing":
-                    self.canvas.put(column, row, flat.get(x, y))
+    def holds(self, x, y):
+        across, along = abs(4 * x + self._lean * y), abs(4 * y - self._lean * x)
+        corner = across > _HALF_ACROSS - _BLUNT and along > _HALF_ALONG - _BLUNT
+        return across <= _HALF_ACROSS and along <= _HALF_ALONG and not corner
+
+    def _ends(self, x, y):
+        return not all(self.holds(x + dx, y + dy) for dx in (-1, 0, 1) for dy in (-1, 0, 1))
+
+    def lay(self, upright, x, y):
+        """Lays an upright drawing with its middle at a pixel, its rows moved on with the lean."""
+        left, top = _REACH + x - upright.width // 2, _REACH + y - upright.height // 2
+        for row in range(upright.height):
+            moved = self._lean * ((upright.height // 2 - row) // 4)
+            for column in range(upright.width):
+                if upright.get(column, row) != "nothing":
+                    self.canvas.put(left + column + moved, top + row, upright.get(column, row))
 
     def sign_corners(self, places, colour):
-        """Sets signs, and the same upside down."""
+        """Sets signs, which lean of themselves, and the same upside down."""
         corner = Canvas(self.canvas.width, self.canvas.height, "nothing")
         for x, y, name in places:
-            corner.text_grid(x, y, _SIGNS[name], {"#": colour})
+            corner.text_grid(_REACH + x, _REACH + y, _SIGNS[name], {"#": colour})
         self.canvas.blit(corner, 0, 0, "nothing")
         self.canvas.blit(corner.rotated180(), 0, 0, "nothing")
 
+    def draw(self, picture, x, y):
+        picture.blit(self.canvas, x - _REACH, y - _REACH, "nothing")
+
 
 def ace_of_spades():
-    card = LeaningCard(_LEAN)
-    card.canvas.text_grid(12, 18, _SIGNS["spade"], {"#": "ink"})
-    card.sign_corners(((8, 4, "ace letter"), (8, 13, "ace suit")), "ink")
-    return card.canvas
+    card = LeaningCard(1)
+    card.canvas.text_grid(_REACH - 8, _REACH - 9, _SIGNS["spade"], {"#": "ink"})
+    card.sign_corners(((-11, -22, "ace letter"), (-13, -13, "ace suit")), "ink")
+    return card
 
 
 def queen_of_hearts():
-    """The game's own queen, who ends in her sleeves some pixels inside the edges."""
-    card, small = LeaningCard(-_LEAN), cards.new_card()
+    """The game's own queen, as far to the right as the ace lets her be seen."""
+    card, small = LeaningCard(-1), cards.new_card()
     courts.draw(small, "hearts", "queen")
-    left = (card.canvas.width - small.width) // 2
-    top = (card.canvas.height - small.height) // 2
-    for y in range(2, small.height - 2):
-        for x in range(3, small.width - 3):
-            if small.get(x, y) != "white":
-                card.canvas.put(x + left, y + top, small.get(x, y))
-    card.sign_corners(((3, 8, "queen letter"), (3, 17, "queen suit")), "card_red")
-    return card.canvas
+    figure = Canvas(17, small.height - 4, "nothing")
+    for y in range(figure.height):
+        for x in range(figure.width):
+            if small.get(x + 3, y + 2) != "white":
+                figure.put(x, y, small.get(x + 3, y + 2))
+    card.lay(figure, -2, 0)
+    card.sign_corners(((-19, -16, "queen letter"), (-19, -7, "queen suit")), "card_red")
+    return card
 
 
 def chip_stack(picture, x, y, count, colours):
@@ -124,8 +133,11 @@ def title():
     picture = Canvas(WIDTH, HEIGHT)
     table(picture)
     fill(picture, ellipse(50, 82, 24, 6), "felt_1")
-    picture.blit(queen_of_hearts(), 14, 27, "nothing")
-    picture.blit(ace_of_spades(), 42, 27, "nothing")
+    queen, ace = queen_of_hearts(), ace_of_spades()
+    fill(picture, lambda x, y: ellipse(*_FELT)(x, y) and (
+        queen.holds(int(x) - 38, int(y) - 58) or ace.holds(int(x) - 62, int(y) - 59)), "felt_1")
+    queen.draw(picture, 36, 54)
+    ace.draw(picture, 59, 55)
     chip_stack(picture, 12, 88, 4, chips.RED)
     chip_stack(picture, 65, 88, 3, chips.BLUE)
     chip_stack(picture, 39, 94, 1, chips.BLACK)

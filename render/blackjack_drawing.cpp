@@ -70,7 +70,7 @@ void CTableLayout::DrawAdvice(const std::string& text) const {
 }
 
 void CTableLayout::DrawActiveMarker(int position) const {
-  DrawPicture(RectAt(CardCorner(position, 0) - Point{0, 9}, {8, 4}), IDB_ACTIVE_MARK,
+  DrawPicture(RectAt(CardCorner(position, 0) - Point{0, 9}, kActiveMark), IDB_ACTIVE_MARK,
               platform::RasterOp::kAnd);
 }
 
@@ -81,7 +81,7 @@ void CTableLayout::DrawInsuranceButtons() const {
 
 void CTableLayout::DrawVerdictLamp(bool correct) const {
   const Point at{m_rcTable.left + 16, BoxRect().top + 5};
-  DrawPicture(RectAt(at, {13, 13}), correct ? IDB_LAMP_GREEN : IDB_LAMP_RED);
+  DrawPicture(RectAt(at, kLamp), correct ? IDB_LAMP_GREEN : IDB_LAMP_RED);
 }
 
 }  // namespace feltside

@@ -42,9 +42,8 @@ void CFeltsideView::DrawTable(CSurface& surface) {
   LoadTableBitmap();
   const Rect client = GetClientRect();
   const platform::Size size{client.Width(), client.Height()};
-  platform::CBitmap pixels(size);
+  platform::CBitmap pixels(size, m_layout.m_crTable);
   CSurface frame(pixels);
-  frame.FillRect(client, m_layout.m_crTable);
   if (m_bFancyBlackjack != 0) frame.BitBlt({}, kTablePicture, *m_pTableBitmap);
   m_layout.Prepare(frame, client);
   if (m_nGameType == kGameBlackjack) {

@@ -28,5 +28,11 @@ inline constexpr int IDI_BET_UP_OFF = 139;
 inline constexpr platform::Size kTablePicture{240, 268};
 inline constexpr platform::Size kPokerPicture{240, 270};
 inline constexpr platform::Size kTitlePicture{96, 116};
+inline constexpr platform::Size kStrategyPicture{24, 22};
+inline constexpr platform::Size kInsurancePicture{73, 17};
+inline constexpr platform::Size kNoInsurancePicture{55, 17};
+inline constexpr platform::Size kBetIcon{16, 16};
+inline constexpr platform::Size kActiveMark{8, 4};
+inline constexpr platform::Size kLamp{13, 13};
 
 }  // namespace feltside

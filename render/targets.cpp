@@ -1,37 +1,29 @@
 // What a tap can hit: where it stands, and which of it lies under a point.
 
+#include "render/picture_ids.h"
 #include "render/table_layout.h"
 
 namespace feltside {
-namespace {
-
-// Of the buttons' pictures.
-constexpr platform::Size kStrategySize{24, 22};
-constexpr platform::Size kInsuranceSize{73, 17};
-constexpr platform::Size kNoInsuranceSize{55, 17};
-constexpr platform::Size kBetIconSize{16, 16};
-
-}  // namespace
 
 using platform::Point;
 using platform::Rect;
 
 Rect CTableLayout::StrategyButtonRect() const {
-  return RectAt(Center() + Point{48, -27}, kStrategySize);
+  return RectAt(Center() + Point{48, -27}, kStrategyPicture);
 }
 
 int CTableLayout::InsuranceTop() const { return CardCorner(POS_BOTTOM, 0).y - 27; }
 
 Rect CTableLayout::InsuranceYesRect() const {
-  return RectAt({Center().x - 64, InsuranceTop()}, kInsuranceSize);
+  return RectAt({Center().x - 64, InsuranceTop()}, kInsurancePicture);
 }
 
 Rect CTableLayout::InsuranceNoRect() const {
-  return RectAt({Center().x + 10, InsuranceTop()}, kInsuranceSize);
+  return RectAt({Center().x + 10, InsuranceTop()}, kInsurancePicture);
 }
 
 Rect CTableLayout::InsuranceNoPicture() const {
-  return RectAt(InsuranceNoRect().TopLeft(), kNoInsuranceSize);
+  return RectAt(InsuranceNoRect().TopLeft(), kNoInsurancePicture);
 }
 
 int CTableLayout::BetTop() const { return BoxLineTop(2); }
@@ -41,7 +33,7 @@ Rect CTableLayout::BetDownRect() const {
 }
 
 Rect CTableLayout::BetDownPicture() const {
-  return RectAt({BoxRect().right - 37, BetTop()}, kBetIconSize);
+  return RectAt({BoxRect().right - 37, BetTop()}, kBetIcon);
 }
 
 Rect CTableLayout::BetUpRect() const {
@@ -49,7 +41,7 @@ Rect CTableLayout::BetUpRect() const {
 }
 
 Rect CTableLayout::BetUpPicture() const {
-  return RectAt({BoxRect().right - 21, BetTop()}, kBetIconSize);
+  return RectAt({BoxRect().right - 21, BetTop()}, kBetIcon);
 }
 
 Rect CTableLayout::DealButtonRect() const {

@@ -47,7 +47,7 @@ bool CFeltsideApp::InitInstance() {
   };
   AddDocTemplate(std::make_unique<platform::CSingleDocTemplate>(kDocumentString, makers));
   if (!OpenNewDocument()) return false;
-  RestoreWindowPlace();
+  RestoreWindowPlace(m_mapStored[kWindowSection]);
   ShowMainWindow(IDR_MAINFRAME);
   LoadHighScores();
   return true;
@@ -55,13 +55,15 @@ bool CFeltsideApp::InitInstance() {
 
 int CFeltsideApp::ExitInstance() {
   SaveHighScores();
-  StoreWindowPlace();
+  StoreWindowPlace(m_mapStored[kWindowSection]);
   return CApplication::ExitInstance();
 }
 
 const platform::CProfileSection& CFeltsideApp::ReadSettings() {
-  m_settings = Profile().Read(kSettingsSection);
-  return m_settings;
+  const auto stored = Profile().Read();
+  m_bReadSettings = stored.has_value();
+  m_mapStored = stored.value_or(platform::CProfileSections());
+  return m_mapStored[kSettingsSection];
 }
 
 bool CFeltsideApp::CanShowNotice() const {

@@ -29,8 +29,11 @@ class CFeltsideApp : public platform::CApplication {
   /// Takes over the list of another game that has kept a result since this one read it.
   void RefreshHighScores();
 
-  /// Reads the settings and high scores as they are stored now.
+  /// Reads what is stored now, and returns the settings and high scores of it; they are good until
+  /// the next call.
   const platform::CProfileSection& ReadSettings();
+  /// Whether that could be read.
+  bool HasReadSettings() const { return m_bReadSettings; }
 
  protected:
   bool InitInstance() override;
@@ -44,12 +47,14 @@ class CFeltsideApp : public platform::CApplication {
 
   void OnNew();
   void OnAbout();
+  /// Takes them from what the view has read at its start.
   void LoadHighScores();
   void SaveHighScores();
   void InsertHighScore(const std::string& name, int score);
   void TakeOver(const std::vector<std::string>& stored);
 
-  platform::CProfileSection m_settings;  ///< as last read
+  platform::CProfileSections m_mapStored;  ///< as last read
+  bool m_bReadSettings = false;
   std::vector<std::string> m_arrHighScores;
   std::vector<std::string> m_arrLoadedScores;           ///< as they were last seen stored
   std::vector<std::pair<std::string, int>> m_arrAdded;  ///< and not stored yet

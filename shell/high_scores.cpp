@@ -26,8 +26,9 @@ std::vector<std::string> EntriesOf(const platform::CProfileSection& stored) {
 
 }  // namespace
 
-/// As they were when the settings were read, a moment ago.
-void CFeltsideApp::LoadHighScores() { m_arrHighScores = m_arrLoadedScores = EntriesOf(m_settings); }
+void CFeltsideApp::LoadHighScores() {
+  m_arrHighScores = m_arrLoadedScores = EntriesOf(m_mapStored[kSettingsSection]);
+}
 
 void CFeltsideApp::RefreshHighScores() { TakeOver(EntriesOf(ReadSettings())); }
 

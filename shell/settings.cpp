@@ -2,10 +2,11 @@
 
 #include "shell/settings.h"
 
-#include <algorithm>
 #include <array>
+#include <cstddef>
 #include <limits>
 #include <type_traits>
+#include <utility>
 
 #include "shell/feltside_app.h"
 #include "table/feltside_view.h"
@@ -27,15 +28,20 @@ constexpr std::array<int, 3> kDealerDelays = {2000, 1000, 200};
 struct CFeltsideView::Settings {
   using View = CFeltsideView;
 
-  struct Setting {
+  struct Entry {
     const char* name;
     int lowest, highest;  ///< what lies outside counts as absent
     int absent;           ///< the default
     int (*get)(const View&);
     void (*set)(View&, int);
+
+    void Load(View& view, const platform::CProfileSection& stored) const {
+      const int value = stored.GetInt(name, absent);
+      set(view, value >= lowest && value <= highest ? value : absent);
+    }
   };
 
-  // Of a member, or of one of a member: view.*a.*b.
+  // Of a member that is named by its path: of a member of the view, or of a member of one.
   template <auto... Path>
   static int Get(const View& view) {
     return static_cast<int>((view.*....*Path));
@@ -46,7 +52,7 @@ struct CFeltsideView::Settings {
     member = static_cast<std::remove_reference_t<decltype(member)>>(value);
   }
   template <auto... Path>
-  static constexpr Setting Of(const char* name, int lowest, int highest, int absent) {
+  static constexpr Entry Of(const char* name, int lowest, int highest, int absent) {
     return {name, lowest, highest, absent, &Get<Path...>, &Set<Path...>};
   }
 
@@ -57,42 +63,46 @@ struct CFeltsideView::Settings {
   static int GetPlaySpeed(const View& view) { return view.PlaySpeed(); }
   static void SetPlaySpeed(View& view, int speed) { view.SetPlaySpeed(speed); }
 
-  static const std::array<Setting, 11> kAll;
+  static const std::array<Entry, kSettingCount> kAll;
 };
 
-/// In the order in which they are read.
-constexpr std::array<CFeltsideView::Settings::Setting, 11> CFeltsideView::Settings::kAll = {{
-    {"GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack, &Get<&View::m_nGameType>,
-     &SetGameType},
-    Of<&View::m_bUseHighScores>("USEHIGH", 0, 1, 1),
-    Of<&View::m_bFancyPoker>("FANCYVP", 0, 1, 1),
-    Of<&View::m_bFancyBlackjack>("FANCYBJ", 0, 1, 1),
-    Of<&View::m_layout, &CTableLayout::m_nCardBackID>("CARDBACK", kFirstCardBackID, kLastCardBackID,
-                                                      kFirstCardBackID),
-    Of<&View::m_layout, &CTableLayout::m_crTable>("TABLECOLOR", 0, kLastColor, kDefaultTable),
-    Of<&View::m_layout, &CTableLayout::m_crBox>("BOXCOLOR", 0, kLastColor, kDefaultBox),
-    Of<&View::m_nMaxDiscards>("VIDEODISCARDS", 0, kPokerCards, 3),
-    Of<&View::m_nStrategyMode>("STRATTYPE", kStrategyNone, kStrategyAlways, kStrategyButton),
-    Of<&View::m_nDeckChoice>("NUMDECKS", 0, 2, 1),
-    {"PLAYSPEED", kLeast, kMost, 1, &GetPlaySpeed, &SetPlaySpeed},
-}};
+/// One for each Setting, in their order.
+constexpr std::array<CFeltsideView::Settings::Entry, kSettingCount> CFeltsideView::Settings::kAll =
+    {{
+        {"GAME_TYPE", kGameBlackjack, kGameVideoPoker, kGameBlackjack, &Get<&View::m_nGameType>,
+         &SetGameType},
+        Of<&View::m_bUseHighScores>("USEHIGH", 0, 1, 1),
+        Of<&View::m_bFancyPoker>("FANCYVP", 0, 1, 1),
+        Of<&View::m_bFancyBlackjack>("FANCYBJ", 0, 1, 1),
+        Of<&View::m_layout, &CTableLayout::m_nCardBackID>("CARDBACK", kFirstCardBackID,
+                                                          kLastCardBackID, kFirstCardBackID),
+        Of<&View::m_layout, &CTableLayout::m_crTable>("TABLECOLOR", 0, kLastColor, kDefaultTable),
+        Of<&View::m_layout, &CTableLayout::m_crBox>("BOXCOLOR", 0, kLastColor, kDefaultBox),
+        Of<&View::m_nMaxDiscards>("VIDEODISCARDS", 0, kPokerCards, 3),
+        Of<&View::m_nStrategyMode>("STRATTYPE", kStrategyNone, kStrategyAlways, kStrategyButton),
+        Of<&View::m_nDeckChoice>("NUMDECKS", 0, 2, 1),
+        {"PLAYSPEED", kLeast, kMost, 1, &GetPlaySpeed, &SetPlaySpeed},
+    }};
 
 void CFeltsideView::LoadSettings() {
   const platform::CProfileSection& stored = TheFeltsideApp().ReadSettings();
-  for (const Settings::Setting& setting : Settings::kAll) {
-    const int value = stored.GetInt(setting.name, setting.absent);
-    const bool isInRange = value >= setting.lowest && value <= setting.highest;
-    setting.set(*this, isInRange ? value : setting.absent);
+  for (const Settings::Entry& setting : Settings::kAll) setting.Load(*this, stored);
+  m_bSettingsUnread = TheFeltsideApp().HasReadSettings() ? 0 : 1;
+}
+
+void CFeltsideView::LoadUnreadSettings(const platform::CProfileSection& stored) {
+  if (std::exchange(m_bSettingsUnread, 0) == 0) return;
+  for (const Settings::Entry& setting : Settings::kAll) {
+    if (setting.get(*this) == setting.absent) setting.Load(*this, stored);
   }
 }
 
-void CFeltsideView::StoreSettings(std::initializer_list<const char*> names) {
+void CFeltsideView::StoreSettings(std::initializer_list<Setting> settings) {
   TheFeltsideApp().Profile().Update(kSettingsSection, [&](platform::CProfileSection& stored) {
-    for (const std::string name : names) {
-      const auto* setting =
-          std::find_if(Settings::kAll.begin(), Settings::kAll.end(),
-                       [&](const Settings::Setting& each) { return each.name == name; });
-      stored.Set(name, setting->get(*this));
+    LoadUnreadSettings(stored);
+    for (const Setting setting : settings) {
+      const Settings::Entry& entry = Settings::kAll[static_cast<std::size_t>(setting)];
+      stored.Set(entry.name, entry.get(*this));
     }
   });
 }

@@ -1,6 +1,7 @@
 // The setup commands: they show the table's settings in a dialog and, when it is confirmed, take
 // them over, keep them and repaint.
 
+#include "shell/settings.h"
 #include "shell/setup_dlg.h"
 #include "shell/setup_table_dlg.h"
 #include "table/feltside_view.h"
@@ -24,7 +25,7 @@ void CFeltsideView::OnGameSetup() {
   m_nStrategyMode = dialog.m_nStrategy;
   m_nDeckChoice = dialog.m_nDecks;
   SetPlaySpeed(dialog.m_nSpeed);
-  StoreSettings({"STRATTYPE", "GAME_TYPE", "NUMDECKS", "PLAYSPEED"});
+  StoreSettings({kStrategyMode, kGameType, kDeckChoice, kPlaySpeed});
   OnDeal();
 }
 
@@ -45,8 +46,8 @@ void CFeltsideView::OnTableSetup() {
   m_bFancyBlackjack = dialog.m_bFancyBlackjack;
   m_bUseHighScores = dialog.m_bUseHighScores;
   m_nMaxDiscards = dialog.m_bFiveDiscards != 0 ? kManyDiscards : kFewDiscards;
-  StoreSettings(
-      {"TABLECOLOR", "BOXCOLOR", "CARDBACK", "VIDEODISCARDS", "FANCYVP", "FANCYBJ", "USEHIGH"});
+  StoreSettings({kTableColor, kBoxColor, kCardBack, kMaxDiscards, kFancyPoker, kFancyBlackjack,
+                 kUseHighScores});
   if (m_bFancyPoker == 0) m_pPokerBitmap.reset();
   Repaint();
 }

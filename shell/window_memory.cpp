@@ -9,8 +9,6 @@
 namespace feltside {
 namespace {
 
-constexpr const char* kSection = "Window";
-
 struct Entry {
   const char* name;
   int platform::Rect::*side;
@@ -31,8 +29,7 @@ bool IsSensible(const platform::Rect& rect) {
   return !rect.IsEmpty() && rect.Intersection(all) == rect;
 }
 
-std::optional<platform::WindowPlace> StoredPlace() {
-  const platform::CProfileSection section = platform::TheApp().Profile().Read(kSection);
+std::optional<platform::WindowPlace> PlaceIn(const platform::CProfileSection& section) {
   platform::WindowPlace place;
   for (const Entry& entry : kEntries) place.rect.*entry.side = section.GetInt(entry.name, 0);
   place.maximized = section.GetInt(kMaximized, 0) == 1;
@@ -41,14 +38,14 @@ std::optional<platform::WindowPlace> StoredPlace() {
 
 }  // namespace
 
-void RestoreWindowPlace() {
-  if (const auto place = StoredPlace()) platform::TheHost().SetWindowPlace(*place);
+void RestoreWindowPlace(const platform::CProfileSection& stored) {
+  if (const auto place = PlaceIn(stored)) platform::TheHost().SetWindowPlace(*place);
 }
 
-void StoreWindowPlace() {
+void StoreWindowPlace(const platform::CProfileSection& stored) {
   const auto place = platform::TheHost().GetWindowPlace();
-  if (!place || place == StoredPlace()) return;
-  platform::TheApp().Profile().Update(kSection, [&place](platform::CProfileSection& section) {
+  if (!place || place == PlaceIn(stored)) return;
+  platform::TheApp().Profile().Update(kWindowSection, [&place](platform::CProfileSection& section) {
     for (const Entry& entry : kEntries) section.Set(entry.name, place->rect.*entry.side);
     section.Set(kMaximized, place->maximized ? 1 : 0);
   });

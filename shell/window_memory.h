@@ -1,13 +1,18 @@
 #pragma once
 
+#include "platform/store/profile.h"
+
 namespace feltside {
 
-// The window opens where the player left it the last time. Both take the application's profile, and
-// do nothing where the machine has no windows to move.
+// The window opens where the player left it the last time. Both take the section as it was last
+// read, and do nothing where the machine has no windows to move.
+
+/// The section of the profile that holds the window's place.
+inline constexpr char kWindowSection[] = "Window";
 
 /// Comes before the window is shown.
-void RestoreWindowPlace();
+void RestoreWindowPlace(const platform::CProfileSection& stored);
 /// Writes nothing where the window still is as it was restored, or was never moved.
-void StoreWindowPlace();
+void StoreWindowPlace(const platform::CProfileSection& stored);
 
 }  // namespace feltside

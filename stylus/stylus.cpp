@@ -31,6 +31,7 @@ int FocusOf(const platform::CDialog& dialog) {
 CStylus::CStylus(platform::OffscreenHost& host, CFeltsideApp& app, std::istream& in,
                  std::ostream& out)
     : m_host(host), m_app(app), m_in(in), m_out(out) {
+  m_in.exceptions(std::ios::badbit);  // a line that memory does not suffice for is not the end
   m_host.SetIdleHandler([this] { return OnIdle(); });
 }
 

@@ -4,6 +4,7 @@
 #include <nlohmann/json.hpp>
 #include <ostream>
 #include <string>
+#include <vector>
 
 #include "platform/dialog/dialog.h"
 #include "platform/host/offscreen_host.h"
@@ -16,6 +17,7 @@ namespace feltside {
 /// answers each with a line of JSON once the program is idle again.
 class CStylus {
  public:
+  /// All four must outlive it.
   CStylus(platform::OffscreenHost& host, CFeltsideApp& app, std::istream& in, std::ostream& out);
 
   /// Runs the program to its end, answers the last command and returns the exit code.
@@ -24,8 +26,8 @@ class CStylus {
  private:
   using Json = nlohmann::ordered_json;
   using Words = std::vector<std::string>;
-  /// A command's name, the words that follow it, what it does and how many words there may be;
-  /// `run` throws a CommandError that says what is wrong with them.
+  /// A command's name, what may follow it, what it does and how many words may follow; `run` is
+  /// given the whole line and then each of them, and throws a CommandError that says what is wrong.
   struct Command {
     const char* name;
     const char* words;

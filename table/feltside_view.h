@@ -12,7 +12,13 @@
 #include "platform/window/view.h"
 #include "render/table_layout.h"
 
+namespace platform {
+class CProfileSection;
+}
+
 namespace feltside {
+
+enum Setting : int;
 
 inline constexpr int kGameBlackjack = 0;
 inline constexpr int kGameVideoPoker = 1;
@@ -102,7 +108,7 @@ class CFeltsideView : public platform::CView {
   /// Meanwhile the frame is disabled; keys that come are dropped, taps wait until it is over.
   void DealerPlay();
   /// Clears away the commands that were already waiting when the dealer began: the disabled frame
-  /// refuses them. Taps, keys and what asks to leave the program wait on, as in the pauses.
+  /// refuses them. Everything else is kept back, as in the pauses, until the deal is settled.
   void PumpMessages();
   /// Ends the deal and moves its money, with the dealer's hand as it stands.
   void Settle();
@@ -184,7 +190,8 @@ class CFeltsideView : public platform::CView {
   void OnDraw(platform::CSurface& surface) override;
   void DrawTitle(platform::CSurface& surface);
   void DrawTable(platform::CSurface& surface);
-  // Each picture is loaded at its first use and kept, the title's until the first deal.
+  // Each picture is loaded at its first use and kept: the title's until the first deal, the
+  // poker table's until it is switched off.
   void LoadTitleBitmap();
   void LoadTableBitmap();
   void LoadPokerBitmap();
@@ -210,8 +217,11 @@ class CFeltsideView : public platform::CView {
   struct Settings;
   /// While a hand is played its game stays selected, whatever the profile says.
   void LoadSettings();
+  /// Catches up on settings that could not be read in their time: none is to be lost to a default
+  /// that stood in for it. What was chosen since stands.
+  void LoadUnreadSettings(const platform::CProfileSection& stored);
   /// Stores these in one step, in this order.
-  void StoreSettings(std::initializer_list<const char*> names);
+  void StoreSettings(std::initializer_list<Setting> settings);
   /// Sets the dealer's pause by a speed, 0 slow to 2 fast; any other leaves it as it was.
   void SetPlaySpeed(int speed);
   /// The speed that the pause stands for; -1 for none.
@@ -256,6 +266,7 @@ class CFeltsideView : public platform::CView {
   int m_nBet = 5;             ///< dollars; a multiple of 5, at least 5
   int m_nDealerDelay = 1000;  ///< milliseconds between the dealer's cards: 2000, 1000 or 200
   int m_bHandInProgress = 0;  ///< until the dealer's play begins; in video poker until the draw
+  int m_bSettingsUnread = 0;  ///< the defaults stand in for what could not be read
   int m_bUseHighScores = 1;
   int m_bPlayingSplit = 0;
   int m_bFancyBlackjack = 1;

@@ -15,6 +15,7 @@ tools/library_sources.sh freetype png zlib || exit 1
 for preset in node check; do
   targets=(feltside-stylus)
   [ $preset = node ] || targets+=(play-tests)
+  : >build/$preset/build.log
   build $preset build/$preset/build.log "${targets[@]}" || {
     say_faults build/$preset/build.log
     fail 'the build failed'

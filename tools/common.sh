@@ -8,11 +8,11 @@ fail() {
 }
 
 # build PRESET LOG [OPTION...]: brings build/PRESET up to date, with options for ninja; configures only
-# where that has not been done.
+# where that has not been done, or for another preset than is there now.
 build() {
   local preset=$1 log=$2 folder=build/$1
   shift 2
-  if ! [ -f "$folder/build.ninja" ] ||
+  if ! [ -f "$folder/build.ninja" ] || [ CMakePresets.json -nt "$folder/CMakeCache.txt" ] ||
     ! grep -qxF "CMAKE_HOME_DIRECTORY:INTERNAL=$PWD" "$folder/CMakeCache.txt"; then
     cmake --fresh --preset "$preset" >"$log" 2>&1 || return
   fi

@@ -7,11 +7,11 @@
 #include <array>
 #include <cstddef>
 #include <cstdlib>
-#include <functional>
-#include <new>
 #include <utility>
 
 #include "platform/draw/embedded.h"
+#include "platform/draw/font_finder.h"
+#include "platform/draw/type_memory.h"
 
 namespace platform {
 namespace {
@@ -38,58 +38,6 @@ int Nearest(FT_Pos parts) { return static_cast<int>((parts + kPartsOfPixel / 2) 
 int Ceiling(FT_Pos parts) { return static_cast<int>((parts + kPartsOfPixel - 1) >> 6); }
 short Short(int pixels) { return static_cast<short>(pixels); }
 
-/// The memory of the type library, which ends in a fault where it is refused the little that its
-/// hinting begins with: so the reserve helps out. Whoever used it gives all back before the next.
-class TypeMemory {
- public:
-  FT_Memory Handle() { return &m_record; }
-  /// Whether the machine has refused memory since this was last asked.
-  bool WasShort() { return std::exchange(m_bShort, false); }
-
- private:
-  static void* Allocate(FT_Memory memory, long size) {
-    void* block = ::operator new(static_cast<std::size_t>(size), std::nothrow);
-    return block != nullptr ? block : From(memory).TakeReserve(static_cast<std::size_t>(size));
-  }
-  static void Free(FT_Memory memory, void* block) {
-    if (!From(memory).GiveBack(block)) ::operator delete(block);
-  }
-  static void* Reallocate(FT_Memory memory, long oldSize, long newSize, void* block) {
-    void* moved = Allocate(memory, newSize);
-    if (moved == nullptr) return nullptr;
-    std::copy_n(static_cast<char*>(block), std::min(oldSize, newSize), static_cast<char*>(moved));
-    Free(memory, block);
-    return moved;
-  }
-  static TypeMemory& From(FT_Memory memory) { return *static_cast<TypeMemory*>(memory->user); }
-
-  void* TakeReserve(std::size_t size) {
-    constexpr std::size_t kAlign = alignof(std::max_align_t);
-    m_bShort = true;
-    if (size > m_arrReserve.size() - m_nTaken) return nullptr;
-    ++m_nBlocks;
-    return &m_arrReserve[std::exchange(m_nTaken, m_nTaken + (size + kAlign - 1) / kAlign * kAlign)];
-  }
-  bool GiveBack(void* block) {
-    const std::less<const void*> before;
-    const char* end = m_arrReserve.data() + m_arrReserve.size();
-    if (before(block, m_arrReserve.data()) || !before(block, end)) return false;
-    if (--m_nBlocks == 0) m_nTaken = 0;
-    return true;
-  }
-
-  FT_MemoryRec_ m_record{this, Allocate, Free, Reallocate};
-  bool m_bShort = false;
-  int m_nBlocks = 0;
-  std::size_t m_nTaken = 0;
-  alignas(std::max_align_t) std::array<char, 8192> m_arrReserve{};
-};
-
-TypeMemory& Memory() {
-  static TypeMemory memory;
-  return memory;
-}
-
 /// The ink of one row of a bitmap of bits, whose left edge stands so far from the pen.
 void AddRow(Glyph& glyph, int y, int left, const unsigned char* bits, int width) {
   const auto isInk = [&](int x) { return x < width && (bits[x / 8] & 0x80 >> x % 8) != 0; };
@@ -102,32 +50,40 @@ void AddRow(Glyph& glyph, int y, int left, const unsigned char* bits, int width)
 
 }  // namespace
 
-/// A file of the type family, open at one size. It has a type library of its own, so that all that
+/// A face open at one size. It has a type library of its own, so that all that
 /// was taken for it can be given back.
 class Face::OpenFace {
  public:
   OpenFace(const char* fileName, int points) {
     const EmbeddedFile* file = FindEmbedded(FontFiles(), fileName);
-    if (file == nullptr || FT_New_Library(Memory().Handle(), &m_library) != 0) return;
-    FT_Add_Default_Modules(m_library);
-    const bool opened = FT_New_Memory_Face(m_library, file->data, static_cast<FT_Long>(file->size),
-                                           0, &m_face) == 0;
-    if (opened && FT_Set_Char_Size(m_face, 0, points * kPartsOfPixel, 0, 0) != 0) m_face = nullptr;
+    if (file == nullptr || !OpenLibrary()) return;
+    FT_New_Memory_Face(m_library, file->data, static_cast<FT_Long>(file->size), 0, &m_face);
+    SetPoints(points);
+  }
+  OpenFace(const FontFile& file, int points) {
+    if (file.path.empty() || !OpenLibrary()) return;
+    FT_New_Face(m_library, file.path.c_str(), file.index, &m_face);
+    SetPoints(points);
   }
   /// The library closes its faces itself.
   ~OpenFace() { FT_Done_Library(m_library); }
   OpenFace(const OpenFace&) = delete;
   OpenFace& operator=(const OpenFace&) = delete;
 
+  /// The rows of a cell above the line that letters stand on.
+  int Ascent() const {
+    if (m_face == nullptr) return 0;
+    return Ceiling(FT_MulFix(m_face->ascender, m_face->size->metrics.y_scale));
+  }
+
   /// Without the ink above and below the cell.
-  Glyph Draw(char32_t character, int cellHeight) const {
+  Glyph Draw(char32_t character, int cellHeight, int ascent) const {
     Glyph glyph;
     if (m_face == nullptr) return glyph;
     glyph.number = FT_Get_Char_Index(m_face, character);
     if (FT_Load_Glyph(m_face, glyph.number, FT_LOAD_RENDER | FT_LOAD_TARGET_MONO) != 0) return {};
     const FT_GlyphSlotRec& drawn = *m_face->glyph;
     glyph.advance = Short(Nearest(drawn.advance.x));
-    const int ascent = Ceiling(FT_MulFix(m_face->ascender, m_face->size->metrics.y_scale));
     const int top = ascent - drawn.bitmap_top;
     const int last = std::min(static_cast<int>(drawn.bitmap.rows), cellHeight - top);
     for (int row = std::max(0, -top); row < last; ++row) {
@@ -145,6 +101,17 @@ class Face::OpenFace {
   }
 
  private:
+  bool OpenLibrary() {
+    if (FT_New_Library(static_cast<FT_Memory>(TypeMemory()), &m_library) != 0) return false;
+    FT_Add_Default_Modules(m_library);
+    return true;
+  }
+  void SetPoints(int points) {
+    if (m_face != nullptr && FT_Set_Char_Size(m_face, 0, points * kPartsOfPixel, 0, 0) != 0) {
+      m_face = nullptr;
+    }
+  }
+
   FT_Library m_library = nullptr;
   FT_Face m_face = nullptr;
 };
@@ -170,7 +137,7 @@ Face::OpenFace* Face::Open() {
 }
 
 bool Face::CloseIfShort() {
-  if (!Memory().WasShort()) return false;
+  if (!TypeMemoryWasShort()) return false;
   m_pOpenFace.reset();
   return true;
 }
@@ -181,9 +148,18 @@ const Glyph& Face::Find(char32_t character) {
   static const Glyph kNone;
   const OpenFace* face = Open();
   if (face == nullptr) return kNone;
-  Glyph glyph = face->Draw(character, m_nCellHeight);
+  Glyph glyph = face->Draw(character, m_nCellHeight, face->Ascent());
+  if (glyph.number == 0) UseSecondFace(character, face->Ascent(), glyph);
   if (CloseIfShort()) return kNone;
   return m_mapGlyphs.emplace(character, std::move(glyph)).first->second;
+}
+
+void Face::UseSecondFace(char32_t character, int ascent, Glyph& glyph) const {
+  const OpenFace face(FindFontFile(character), m_nPoints);
+  Glyph drawn = face.Draw(character, m_nCellHeight, ascent);
+  if (drawn.number == 0) return;
+  drawn.number = 0;  // no letter of the first face, which knows nothing of how it kerns
+  glyph = std::move(drawn);
 }
 
 int Face::Kerning(const Glyph& first, const Glyph& second) {

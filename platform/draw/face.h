@@ -21,7 +21,8 @@ class Face {
 
   int CellHeight() const { return m_nCellHeight; }
   bool IsBold() const { return m_bBold; }
-  /// Drawn at its first use and kept; a box where the face lacks the character.
+  /// Drawn at its first use and kept. A character that the face lacks is taken from a face that the
+  /// machine has for it; a box where it has none.
   const Glyph& Find(char32_t character);
   /// By how many pixels, most often below 0, two letters stand farther apart than their advance.
   int Kerning(const Glyph& first, const Glyph& second);
@@ -34,6 +35,8 @@ class Face {
   /// Whether memory has been short since this was last asked; then the face is closed, as the type
   /// library may have done without what it was refused.
   bool CloseIfShort();
+
+  void UseSecondFace(char32_t character, int ascent, Glyph& glyph) const;
 
   int m_nCellHeight;
   int m_nPoints;

@@ -9,6 +9,9 @@
 namespace platform {
 namespace {
 
+/// Of the sides of a picture, in pixels; what says that it is larger is damaged.
+constexpr png_uint_32 kLongestSide = 4096;
+
 /// Our pixels are 0xAARRGGBB in memory order of this machine.
 constexpr png_uint_32 kPixelFormat =
     std::endian::native == std::endian::little ? PNG_FORMAT_BGRA : PNG_FORMAT_ARGB;
@@ -24,6 +27,10 @@ png_image StartImage() {
 std::optional<CBitmap> DecodePicture(const EmbeddedFile& file) {
   png_image image = StartImage();
   if (png_image_begin_read_from_memory(&image, file.data, file.size) == 0) return std::nullopt;
+  if (image.width > kLongestSide || image.height > kLongestSide) {
+    png_image_free(&image);
+    return std::nullopt;
+  }
   image.format = kPixelFormat;
   CBitmap bitmap({static_cast<int>(image.width), static_cast<int>(image.height)});
   // The library frees what it holds of the picture, whatever comes of it.

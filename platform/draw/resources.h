@@ -37,7 +37,7 @@ class CResources {
 /// The picture in a PNG file, whatever its colour type; nothing where it cannot be read.
 std::optional<CBitmap> DecodePicture(const EmbeddedFile& file);
 
-/// Writes a bitmap as a PNG file; answers whether it was written.
+/// Writes a bitmap as a PNG file; returns whether it was written.
 bool SavePng(const CBitmap& bitmap, const std::string& path);
 
 }  // namespace platform

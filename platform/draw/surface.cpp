@@ -11,10 +11,11 @@ constexpr Pixel kOpaqueBits = 0xFF000000U;
 
 CSurface::CSurface(CBitmap& target) : CSurface(target, target.Bounds()) {}
 
-CSurface::CSurface(CBitmap& target, const Rect& part) : m_pTarget(&target), m_part(part) {}
+CSurface::CSurface(CBitmap& target, const Rect& part) : m_pTarget(&target), m_rcPart(part) {}
 
 CSurface::CSurface(const CSurface& whole, const Rect& part)
-    : CSurface(*whole.m_pTarget, part.Moved(whole.m_part.TopLeft()).Intersection(whole.m_part)) {}
+    : CSurface(*whole.m_pTarget,
+               part.Moved(whole.m_rcPart.TopLeft()).Intersection(whole.m_rcPart)) {}
 
 Font CSurface::SetFont(const Font& font) { return std::exchange(m_state.font, font); }
 Color CSurface::SetTextColor(Color color) { return std::exchange(m_state.textColor, color); }
@@ -24,7 +25,7 @@ Color CSurface::SetBrush(Color color) { return std::exchange(m_state.brush, colo
 Color CSurface::SetPen(Color color) { return std::exchange(m_state.pen, color); }
 
 Rect CSurface::Visible(const Rect& rect) const {
-  return rect.Moved(m_part.TopLeft()).Intersection(m_part).Intersection(m_pTarget->Bounds());
+  return rect.Moved(m_rcPart.TopLeft()).Intersection(m_rcPart).Intersection(m_pTarget->Bounds());
 }
 
 /// Calls the rule with each pixel of the rectangle that the target has, and its place on this
@@ -34,7 +35,7 @@ void CSurface::EachPixel(const Rect& rect, PixelRule rule) {
   const Rect visible = Visible(rect);
   for (int y = visible.top; y < visible.bottom; ++y) {
     for (int x = visible.left; x < visible.right; ++x) {
-      rule(m_pTarget->At({x, y}), Point{x, y} - m_part.TopLeft());
+      rule(m_pTarget->At({x, y}), Point{x, y} - m_rcPart.TopLeft());
     }
   }
 }
@@ -66,7 +67,7 @@ void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt
   const Point shift = at - sourceAt;
   const Rect visible = Visible(RectAt(at, size).Intersection(source.Bounds().Moved(shift)));
   if (visible.IsEmpty()) return;
-  const Point toSource = Point{} - shift - m_part.TopLeft();
+  const Point toSource = Point{} - shift - m_rcPart.TopLeft();
   for (int y = visible.top; y < visible.bottom; ++y) {
     const Pixel* from = &source.At(Point{visible.left, y} + toSource);
     Pixel* to = &m_pTarget->At({visible.left, y});
@@ -81,6 +82,8 @@ void CSurface::BitBlt(Point at, Size size, const CBitmap& source, Point sourceAt
 
 void CSurface::StretchBlt(const Rect& to, const CBitmap& source, const Rect& from) {
   if (to.IsEmpty()) return;
+  const Size size{from.Width(), from.Height()};
+  if (to == RectAt(to.TopLeft(), size)) return BitBlt(to.TopLeft(), size, source, from.TopLeft());
   EachPixel(to, [&](Pixel& target, Point p) {
     const Point sample{from.left + (p.x - to.left) * from.Width() / to.Width(),
                        from.top + (p.y - to.top) * from.Height() / to.Height()};
@@ -114,9 +117,9 @@ void CSurface::TextOut(Point at, const std::string& text) {
 void CSurface::DrawText(const Rect& rect, const std::string& text, TextAlign align) {
   const int spare = rect.Width() - TextExtent(text).width;
   const int indent = align == TextAlign::kLeft ? 0 : align == TextAlign::kRight ? spare : spare / 2;
-  CSurface line(*m_pTarget, rect.Moved(m_part.TopLeft()).Intersection(m_part));
+  CSurface line(*m_pTarget, rect.Moved(m_rcPart.TopLeft()).Intersection(m_rcPart));
   line.m_state = m_state;
-  line.TextOut(Point{rect.left + indent, rect.top} + m_part.TopLeft() - line.m_part.TopLeft(),
+  line.TextOut(Point{rect.left + indent, rect.top} + m_rcPart.TopLeft() - line.m_rcPart.TopLeft(),
                text);
 }
 

@@ -32,7 +32,7 @@ class CSurface {
   /// A part of another surface, in a drawing state of its own.
   CSurface(const CSurface& whole, const Rect& part);
 
-  Rect Bounds() const { return RectAt({}, {m_part.Width(), m_part.Height()}); }
+  Rect Bounds() const { return RectAt({}, {m_rcPart.Width(), m_rcPart.Height()}); }
 
   Font SetFont(const Font& font);
   Color SetTextColor(Color color);
@@ -73,7 +73,7 @@ class CSurface {
   void EachPixel(const Rect& rect, PixelRule rule);
 
   CBitmap* m_pTarget;
-  Rect m_part;
+  Rect m_rcPart;
   DrawState m_state;
 };
 

@@ -24,16 +24,16 @@ class Setter {
   Setter(const Font& font, const std::string& text)
       : m_face(Face::Of(font)),
         m_nExtraWeight(font.bold && !m_face.IsBold() ? 1 : 0),
-        m_text(text),
+        m_strText(text),
         m_nRows(static_cast<std::size_t>(m_face.CellHeight())) {
     m_arrEnds.fill(-1);
   }
 
   /// Sets the next letter; false at the end of the text.
   bool Next() {
-    if (m_nNext >= m_text.size()) return false;
-    const Glyph& glyph = m_face.Find(CharacterAt(m_text, m_nNext));
-    m_nNext = NextLetter(m_text, m_nNext);
+    if (m_nNext >= m_strText.size()) return false;
+    const Glyph& glyph = m_face.Find(CharacterAt(m_strText, m_nNext));
+    m_nNext = NextLetter(m_strText, m_nNext);
     int pen = FirstClearPen(glyph);
     if (m_last.glyph != nullptr) {
       const int kerning = m_face.Kerning(*m_last.glyph, glyph);
@@ -73,7 +73,7 @@ class Setter {
 
   Face& m_face;
   int m_nExtraWeight;
-  const std::string& m_text;
+  const std::string& m_strText;
   std::size_t m_nNext = 0;
   SetLetter m_last;
   int m_nWidth = 0;

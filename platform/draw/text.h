@@ -25,7 +25,7 @@ Size MeasureText(const Font& font, const std::string& text);
 std::size_t FittingLength(const Font& font, const std::string& text, int width);
 
 /// The text as a stencil of its extent: opaque pixels where ink stands, see-through ones elsewhere.
-/// A letter that the face lacks shows as a box; one that memory does not suffice for is left out,
+/// A letter that no face has shows as a box; one that memory does not suffice for is left out,
 /// and shows the next time.
 CBitmap RenderText(const Font& font, const std::string& text);
 

@@ -16,9 +16,8 @@ struct HostOptions {
   std::vector<std::filesystem::path> helpFolders;
 };
 
-/// The host of the machine that the program is built for: a window of the desktop, or a page of a
-/// browser. It shows the picture in whatever room it has. Null where there is no display to show it
-/// on; `why` then says what is the matter.
+/// The host of the machine that the program is built for: each such host defines this one function.
+/// Null where there is no display to show a window on; `why` then says what is the matter.
 std::unique_ptr<Host> CreateHost(const HostOptions& options, std::string& why);
 
 }  // namespace platform

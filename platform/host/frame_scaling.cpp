@@ -60,16 +60,16 @@ class WideRow {
   /// The last one is kept, as neighbouring rows of the target often need the same.
   const Row& At(int y) {
     if (y != m_nY) Make(y);
-    return m_row;
+    return m_arrRow;
   }
 
  private:
   void Make(int y) {
     m_nY = y;
-    m_row.clear();
+    m_arrRow.clear();
     for (const Cover& cover : m_arrCovers) {
       const Pixel first = m_frame.At({cover.First(), y});
-      m_row.push_back(cover.First() == cover.Last() ? first : Mixed(cover, y));
+      m_arrRow.push_back(cover.First() == cover.Last() ? first : Mixed(cover, y));
     }
   }
 
@@ -84,7 +84,7 @@ class WideRow {
   const CBitmap& m_frame;
   std::vector<Cover> m_arrCovers;
   int m_nY = -1;
-  Row m_row;
+  Row m_arrRow;
 };
 
 Row MixedRow(WideRow& source, const Cover& cover, int width) {

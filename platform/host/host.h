@@ -20,7 +20,8 @@ class Host {
   Host(const Host&) = delete;
   Host& operator=(const Host&) = delete;
 
-  /// Puts a whole picture of the program's window, always of the same size, before the person.
+  /// Puts a whole picture of the program's window, always of the same size, before the person. It
+  /// must live until the next one is shown: it may be looked at again, and is not kept twice.
   virtual void Show(const CBitmap& frame) = 0;
   /// Names the window and gives it an icon, where there is one.
   virtual void SetIdentity(const std::string& title, const std::optional<CBitmap>& icon) = 0;

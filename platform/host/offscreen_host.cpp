@@ -16,7 +16,7 @@ void OffscreenHost::WaitEvent(int milliseconds) {
     m_nTicks += milliseconds;
     return;
   }
-  if (m_onIdle && m_onIdle()) return;
+  if (m_fnOnIdle && m_fnOnIdle()) return;
   InputEvent close;
   close.kind = InputKind::kClose;
   PutInput(close);

@@ -19,8 +19,8 @@ class OffscreenHost : public Host {
   void PutInput(const InputEvent& event) { m_arrInput.push_back(event); }
   void SetClock(const LocalTime& now);
   /// Called when the program waits for input and there is none, again and again until it has put
-  /// some in. Once it answers false, and without a handler, the window is closed.
-  void SetIdleHandler(std::function<bool()> onIdle) { m_onIdle = std::move(onIdle); }
+  /// some in. Once it returns false, and without a handler, the window is closed.
+  void SetIdleHandler(std::function<bool()> onIdle) { m_fnOnIdle = std::move(onIdle); }
 
   const CBitmap& Shown() const { return m_shown; }
   const std::vector<std::string>& HelpCalls() const { return m_arrHelpCalls; }
@@ -28,8 +28,6 @@ class OffscreenHost : public Host {
   const std::optional<Rect>& TextPlace() const { return m_rcText; }
   /// What was said last; empty before anything was.
   const std::string& Said() const { return m_strSaid; }
-  /// What keeps help viewers from coming up from now on.
-  void SetHelpTrouble(const std::string& trouble) { m_strHelpTrouble = trouble; }
 
   void Show(const CBitmap& frame) override { m_shown = frame; }
   void SetIdentity(const std::string&, const std::optional<CBitmap>&) override {}
@@ -46,14 +44,14 @@ class OffscreenHost : public Host {
   void Say(const std::string& text) override { m_strSaid = text; }
   std::string StartHelpViewer(const std::string& commandLine) override {
     m_arrHelpCalls.push_back(commandLine);
-    return m_strHelpTrouble;
+    return {};
   }
   std::filesystem::path ProfileFolder() override { return m_profileFolder; }
 
  private:
   std::filesystem::path m_profileFolder;
   std::deque<InputEvent> m_arrInput;
-  std::function<bool()> m_onIdle;
+  std::function<bool()> m_fnOnIdle;
   std::int64_t m_nTicks = 0;
   LocalTime m_clock{2000, 1, 1, 12, 0, 0};  ///< what the clock showed when it was last set
   std::int64_t m_nClockSetAt = 0;           ///< the ticks then
@@ -61,7 +59,6 @@ class OffscreenHost : public Host {
   std::string m_strClipboard;
   std::string m_strSaid;
   std::vector<std::string> m_arrHelpCalls;
-  std::string m_strHelpTrouble;
   std::optional<Rect> m_rcText;
   std::optional<WindowPlace> m_windowPlace;
 };

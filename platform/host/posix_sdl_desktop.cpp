@@ -4,26 +4,24 @@
 #include <optional>
 
 #include "platform/host/sdl_desktop.h"
+#include "platform/host/sdl_library.h"
 
 namespace platform {
 namespace {
 
 /// What is needed of the X library, which SDL too loads only where the desktop is one of X.
-class XLibrary {
+class XLibrary : public SdlLibrary {
  public:
-  explicit XLibrary(Display* display)
-      : m_pDisplay(display), m_pLibrary(SDL_LoadObject("libX11.so.6")) {
+  /// For the screen of a window, which need not be the display's first.
+  explicit XLibrary(const SDL_SysWMinfo& window)
+      : SdlLibrary("libX11.so.6"),
+        m_pDisplay(window.info.x11.display),
+        m_window(window.info.x11.window) {
     Load(m_pInternAtom, "XInternAtom");
     Load(m_pGetWindowProperty, "XGetWindowProperty");
     Load(m_pGetWindowAttributes, "XGetWindowAttributes");
-    Load(m_pDefaultRootWindow, "XDefaultRootWindow");
     Load(m_pFree, "XFree");
   }
-  ~XLibrary() { SDL_UnloadObject(m_pLibrary); }
-  XLibrary(const XLibrary&) = delete;
-  XLibrary& operator=(const XLibrary&) = delete;
-
-  bool IsComplete() const { return m_bComplete; }
 
   /// Window managers are told what happens on the root window. One that has gone may have left its
   /// list of features behind.
@@ -39,7 +37,7 @@ class XLibrary {
     unsigned long count = 0;
     unsigned long left = 0;
     unsigned char* bytes = nullptr;
-    m_pGetWindowProperty(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), list, 0, kMostWords, False,
+    m_pGetWindowProperty(m_pDisplay, AttributesOf(m_window).root, list, 0, kMostWords, False,
                          AnyPropertyType, &type, &format, &count, &left, &bytes);
     if (bytes == nullptr) return false;
     constexpr int kAtomBits = 32;
@@ -50,54 +48,46 @@ class XLibrary {
     return found;
   }
 
-  XWindowAttributes Root() const {
-    XWindowAttributes root{};
-    m_pGetWindowAttributes(m_pDisplay, m_pDefaultRootWindow(m_pDisplay), &root);
-    return root;
-  }
+  XWindowAttributes Root() const { return AttributesOf(AttributesOf(m_window).root); }
 
  private:
-  template <class Function>
-  void Load(Function*& function, const char* name) {
-    function = m_pLibrary == nullptr
-                   ? nullptr
-                   : reinterpret_cast<Function*>(SDL_LoadFunction(m_pLibrary, name));
-    m_bComplete = m_bComplete && function != nullptr;
+  XWindowAttributes AttributesOf(Window window) const {
+    XWindowAttributes attributes{};
+    m_pGetWindowAttributes(m_pDisplay, window, &attributes);
+    return attributes;
   }
 
   Display* m_pDisplay;
-  void* m_pLibrary;
-  bool m_bComplete = true;
+  Window m_window;
   decltype(XInternAtom)* m_pInternAtom = nullptr;
   decltype(XGetWindowProperty)* m_pGetWindowProperty = nullptr;
   decltype(XGetWindowAttributes)* m_pGetWindowAttributes = nullptr;
-  decltype(XDefaultRootWindow)* m_pDefaultRootWindow = nullptr;
   decltype(XFree)* m_pFree = nullptr;
 };
 
-/// The X display that a window is on; null where the desktop is none of X.
-Display* DisplayOf(SDL_Window* window) {
+/// What SDL knows of a window on a desktop of X; nothing on another.
+std::optional<SDL_SysWMinfo> OnX(SDL_Window* window) {
   SDL_SysWMinfo info;
   SDL_VERSION(&info.version);
   const bool onX =
       SDL_GetWindowWMInfo(window, &info) == SDL_TRUE && info.subsystem == SDL_SYSWM_X11;
-  return onX ? info.info.x11.display : nullptr;
+  return onX ? std::optional(info) : std::nullopt;
 }
 
 }  // namespace
 
 bool KnowsFullScreen(SDL_Window* window) {
-  Display* display = DisplayOf(window);
-  if (display == nullptr) return true;
-  const XLibrary library(display);
+  const auto info = OnX(window);
+  if (!info) return true;
+  const XLibrary library(*info);
   return library.IsComplete() && library.HasWindowManager() &&
          library.DesktopSupports("_NET_WM_STATE_FULLSCREEN");
 }
 
 Rect StillThere(SDL_Window* window, const Rect& part) {
-  Display* display = DisplayOf(window);
-  if (display == nullptr) return part;
-  const XLibrary library(display);
+  const auto info = OnX(window);
+  if (!info) return part;
+  const XLibrary library(*info);
   if (!library.IsComplete()) return part;
   const XWindowAttributes root = library.Root();
   return part.Intersection(RectAt({}, {root.width, root.height}));

@@ -1,6 +1,6 @@
-#include <SDL.h>
-
 #include "platform/host/create_host.h"
+
+#include <SDL.h>
 #ifdef __GLIBC__
 #include <malloc.h>
 #endif
@@ -11,6 +11,7 @@
 #include "platform/host/help_viewer.h"
 #include "platform/host/profile_folder.h"
 #include "platform/host/sdl_events.h"
+#include "platform/host/sdl_fonts.h"
 #include "platform/host/sdl_video.h"
 #include "platform/host/sdl_window.h"
 
@@ -23,7 +24,12 @@ class SdlHost : public Host {
       : m_pVideo(std::move(video)),
         m_window(options.frameSize),
         m_events(m_window),
-        m_arrHelpFolders(options.helpFolders) {}
+        m_arrHelpFolders(options.helpFolders) {
+    SetFontFinder(FindDesktopFont);
+  }
+  ~SdlHost() override { SetFontFinder(nullptr); }
+  SdlHost(const SdlHost&) = delete;
+  SdlHost& operator=(const SdlHost&) = delete;
 
   bool IsReady() const { return m_window.IsOpen(); }
 

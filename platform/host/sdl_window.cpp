@@ -68,10 +68,9 @@ void SdlWindow::SetIdentity(const std::string& title, const std::optional<CBitma
 }
 
 void SdlWindow::Show(const CBitmap& frame) {
-  m_frame = frame;
   m_bStale = true;
-  if (!m_bShown) m_placement->Show();
-  m_bShown = true;
+  if (m_pFrame == nullptr) m_placement->Show();
+  m_pFrame = &frame;
   Settle();
 }
 
@@ -81,7 +80,7 @@ void SdlWindow::OnWindowEvent(const SDL_WindowEvent& event) {
 }
 
 void SdlWindow::Settle() {
-  if (!m_bShown) return;
+  if (m_pFrame == nullptr) return;
   if (m_bStale) Draw();
   m_placement->Settle();
 }
@@ -93,7 +92,7 @@ void SdlWindow::Draw() {
   if (fit.Place() != RectAt({}, {canvas->w, canvas->h})) {
     SDL_FillRect(canvas, nullptr, SDL_MapRGB(canvas->format, kSurround, kSurround, kSurround));
   }
-  DrawScaled(m_frame, fit.Place(), *canvas);
+  DrawScaled(*m_pFrame, fit.Place(), *canvas);
   m_canvas.End();
   m_bStale = false;
 }

@@ -46,11 +46,10 @@ class SdlWindow {
   void Draw();
 
   Size m_frameSize;
-  CBitmap m_frame;
+  const CBitmap* m_pFrame = nullptr;  ///< the last that was shown
   SDL_Window* m_pWindow = nullptr;
   SdlCanvas m_canvas;
   std::optional<SdlPlacement> m_placement;  ///< of an open window
-  bool m_bShown = false;
   bool m_bStale = false;  ///< the desktop does not show the picture as it should be
 };
 

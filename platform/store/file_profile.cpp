@@ -30,7 +30,7 @@ constexpr char kNoHome[] = "There is no home folder to keep the settings in.";
 struct Contents {
   std::string refusal;  ///< why it cannot be read; empty: it can, or there is none
   std::string text;
-  std::optional<CProfileSection> section;  ///< nothing: the text cannot be understood
+  std::optional<CProfileSections> sections;  ///< nothing: the text cannot be understood
 };
 
 std::string Reason(const std::error_code& error) {
@@ -39,7 +39,7 @@ std::string Reason(const std::error_code& error) {
   return held ? "another running game holds it" : error.message();
 }
 
-Contents Refused(const std::error_code& error) { return {Reason(error), "", CProfileSection()}; }
+Contents Refused(const std::error_code& error) { return {Reason(error), "", CProfileSections()}; }
 
 /// Reads the whole of a file, or more than is to be read of any.
 std::error_code ReadText(const fs::path& file, std::string& text) {
@@ -54,7 +54,7 @@ std::error_code ReadText(const fs::path& file, std::string& text) {
   return {errno == 0 ? EIO : errno, std::generic_category()};
 }
 
-Contents ReadContents(const fs::path& file, const std::string& section) {
+Contents ReadContents(const fs::path& file) {
   std::error_code error;
   const fs::file_status status = fs::status(file, error);
   if (fs::is_other(status)) return Refused(make_error_code(std::errc::not_supported));
@@ -63,7 +63,7 @@ Contents ReadContents(const fs::path& file, const std::string& section) {
   const bool missing =
       error == std::errc::no_such_file_or_directory || error == std::errc::not_a_directory;
   if (error && !missing) return Refused(error);
-  if (contents.text.size() <= kLargestFile) contents.section = ReadSection(contents.text, section);
+  if (contents.text.size() <= kLargestFile) contents.sections = ReadSections(contents.text);
   return contents;
 }
 
@@ -100,13 +100,13 @@ class CFileProfile : public CProfile {
  public:
   explicit CFileProfile(const fs::path& file) : m_file(TargetOf(file)) {}
 
-  CProfileSection Read(const std::string& section) override;
+  std::optional<CProfileSections> Read() override;
   bool Update(const std::string& section, const Change& change) override;
 
  private:
-  Contents ReadUnlocked(const std::string& section);
-  Contents ReadLocked(const std::string& section, const CFileLock& lock);
-  // Each answers why it cannot be done; nothing, when it is done.
+  Contents ReadUnlocked();
+  Contents ReadLocked(const CFileLock& lock);
+  // Each returns why it cannot be done; nothing, when it is done.
   std::string SetAside();
   std::string KeepCopy(const std::string& text, const std::string& name);
   std::string Store(const std::string& section, const Change& change);
@@ -115,21 +115,21 @@ class CFileProfile : public CProfile {
   fs::path m_file;
 };
 
-CProfileSection CFileProfile::Read(const std::string& section) {
+std::optional<CProfileSections> CFileProfile::Read() {
   if (m_file.empty()) {
     Tell(kNoHome);
     return {};
   }
   std::string refusal;
   try {
-    Contents contents = ReadUnlocked(section);
-    if (contents.refusal.empty()) return contents.section.value_or(CProfileSection());
+    Contents contents = ReadUnlocked();
+    if (contents.refusal.empty()) return contents.sections;
     refusal = contents.refusal;
   } catch (const std::bad_alloc&) {
     refusal = kNoMemory;
   }
   Tell(Named() + " cannot be read: " + refusal + ". The defaults hold.");
-  return {};
+  return std::nullopt;
 }
 
 bool CFileProfile::Update(const std::string& section, const Change& change) {
@@ -153,20 +153,20 @@ bool CFileProfile::Update(const std::string& section, const Change& change) {
 
 /// Reads without the lock; only a damaged file is looked at again under it, since another game may
 /// have replaced it meanwhile.
-Contents CFileProfile::ReadUnlocked(const std::string& section) {
-  Contents contents = ReadContents(m_file, section);
-  if (contents.section) return contents;
+Contents CFileProfile::ReadUnlocked() {
+  Contents contents = ReadContents(m_file);
+  if (contents.sections) return contents;
   const CFileLock lock(LockOf(m_file), kPatience);
-  return ReadLocked(section, lock);
+  return ReadLocked(lock);
 }
 
 /// Reads under a lock, and sets aside what cannot be understood. A file that another game holds
 /// cannot be read.
-Contents CFileProfile::ReadLocked(const std::string& section, const CFileLock& lock) {
+Contents CFileProfile::ReadLocked(const CFileLock& lock) {
   if (lock.Error()) return Refused(lock.Error());
-  Contents contents = ReadContents(m_file, section);
-  if (contents.section) return contents;
-  return {SetAside(), "", CProfileSection()};
+  Contents contents = ReadContents(m_file);
+  if (contents.sections) return contents;
+  return {SetAside(), "", CProfileSections()};
 }
 
 std::string CFileProfile::SetAside() {
@@ -197,14 +197,15 @@ std::string CFileProfile::Store(const std::string& section, const Change& change
   fs::create_directories(m_file.parent_path(), error);
   if (error) return Reason(error);
   const CFileLock lock(LockOf(m_file), kPatience);
-  Contents stored = ReadLocked(section, lock);
+  Contents stored = ReadLocked(lock);
   if (!stored.refusal.empty()) return stored.refusal;
-  change(*stored.section);
-  const auto changed = ChangeSection(stored.text, section, *stored.section);
+  CProfileSection& values = (*stored.sections)[section];
+  change(values);
+  const auto changed = ChangeSection(stored.text, section, values);
   if (!changed) return "what else it holds cannot be written again";
   std::string refusal = changed->foreign.empty() ? "" : KeepCopy(stored.text, changed->foreign);
   if (refusal.empty()) refusal = Reason(WriteWhole(m_file, changed->text));
-  if (!refusal.empty()) ListLost(*stored.section);
+  if (!refusal.empty()) ListLost(values);
   return refusal;
 }
 

@@ -16,22 +16,22 @@ std::string CProfileSection::GetString(const std::string& entry, const std::stri
 }
 
 const CProfileSection::Value* CProfileSection::Find(const std::string& entry) const {
-  const auto found = m_values.find(entry);
-  return found == m_values.end() ? nullptr : &found->second;
+  const auto found = m_mapValues.find(entry);
+  return found == m_mapValues.end() ? nullptr : &found->second;
 }
 
 void CProfileSection::Put(const std::string& entry, const Value& value) {
-  m_changes.emplace_back(entry, value);
-  m_values.insert_or_assign(entry, value);
+  m_arrChanges.emplace_back(entry, value);
+  m_mapValues.insert_or_assign(entry, value);
 }
 
-std::vector<std::string> CProfile::TakeTroubles() { return std::exchange(m_troubles, {}); }
+std::vector<std::string> CProfile::TakeTroubles() { return std::exchange(m_arrTroubles, {}); }
 
 void CProfile::Tell(const std::string& trouble) {
   std::fprintf(stderr, "%s\n", trouble.c_str());
-  if (std::find(m_told.begin(), m_told.end(), trouble) != m_told.end()) return;
-  m_told.push_back(trouble);
-  m_troubles.push_back(trouble);
+  if (std::find(m_arrTold.begin(), m_arrTold.end(), trouble) != m_arrTold.end()) return;
+  m_arrTold.push_back(trouble);
+  m_arrTroubles.push_back(trouble);
 }
 
 }  // namespace platform

@@ -45,11 +45,11 @@ std::size_t EndOfString(std::string_view text, std::size_t begin) {
 /// where a value, since a quotation mark in the midst of a value begins no string.
 class CTomlScan {
  public:
-  explicit CTomlScan(std::string_view text) : m_text(text) {}
+  explicit CTomlScan(std::string_view text) : m_strText(text) {}
 
   bool IsSafe() {
-    if (m_text.substr(0, kByteOrderMark.size()) == kByteOrderMark) m_nAt = kByteOrderMark.size();
-    while (m_nAt < m_text.size()) {
+    if (m_strText.substr(0, kByteOrderMark.size()) == kByteOrderMark) m_nAt = kByteOrderMark.size();
+    while (m_nAt < m_strText.size()) {
       if (!Step() || m_nDots > kMostDots || m_strOpen.size() > kMostNested) return false;
     }
     return true;
@@ -58,15 +58,15 @@ class CTomlScan {
  private:
   /// Passes over a comment, a string, a value without quotation marks or a single letter.
   bool Step() {
-    const char c = m_text[m_nAt];
+    const char c = m_strText[m_nAt];
     if (c == '#') {
-      m_nAt = m_text.find('\n', m_nAt);
+      m_nAt = m_strText.find('\n', m_nAt);
     } else if (Contains("\"'", c)) {
-      m_nAt = EndOfString(m_text, m_nAt);
+      m_nAt = EndOfString(m_strText, m_nAt);
       return m_nAt != kNowhere;
     } else if (m_bValue && !Contains(" \t\r\n,[]{}=", c)) {
-      const std::size_t end = m_text.find_first_of(" \t\r\n,]}#", m_nAt);
-      const std::string_view value = m_text.substr(m_nAt, end - m_nAt);
+      const std::size_t end = m_strText.find_first_of(" \t\r\n,]}#", m_nAt);
+      const std::string_view value = m_strText.substr(m_nAt, end - m_nAt);
       m_nAt = end;
       return std::all_of(value.begin(), value.end(), IsAscii);
     } else {
@@ -86,7 +86,7 @@ class CTomlScan {
     if (Contains("{},[]\n", c)) m_bValue = inArray;
   }
 
-  std::string_view m_text;
+  std::string_view m_strText;
   std::size_t m_nAt = 0;
   std::size_t m_nDots = 0;
   bool m_bValue = false;

@@ -26,6 +26,14 @@ std::optional<CProfileSection::Value> ValueOf(const toml::node& node) {
   return CProfileSection::Value{static_cast<int>(*number), {}};
 }
 
+CProfileSection ValuesOf(const toml::table& table) {
+  std::map<std::string, CProfileSection::Value> values;
+  for (const auto& [key, node] : table) {
+    if (const auto value = ValueOf(node)) values.emplace(key.str(), *value);
+  }
+  return CProfileSection(std::move(values));
+}
+
 bool IsOfKind(const toml::node& node, const CProfileSection::Value& value) {
   return value.number ? node.is_integer() : node.is_string();
 }
@@ -101,17 +109,17 @@ std::string Format(const toml::table& document) {
 
 }  // namespace
 
-std::optional<CProfileSection> ReadSection(const std::string& text, const std::string& section) {
+std::optional<CProfileSections> ReadSections(const std::string& text) {
   if (!IsSafeToml(text)) return std::nullopt;
   const toml::parse_result document = toml::parse(text);
   if (document.failed()) return std::nullopt;
-  std::map<std::string, CProfileSection::Value> values;
-  if (const toml::table* table = document[section].as_table()) {
-    for (const auto& [key, node] : *table) {
-      if (const auto value = ValueOf(node)) values.emplace(key.str(), *value);
+  CProfileSections sections;
+  for (const auto& [name, node] : document.table()) {
+    if (const toml::table* table = node.as_table()) {
+      sections.emplace(name.str(), ValuesOf(*table));
     }
   }
-  return CProfileSection(std::move(values));
+  return sections;
 }
 
 std::optional<ChangedText> ChangeSection(const std::string& text, const std::string& section,
@@ -131,7 +139,7 @@ std::optional<ChangedText> ChangeSection(const std::string& text, const std::str
     }
   }
   changed.text = Format(document);
-  if (!ReadSection(changed.text, section)) return std::nullopt;
+  if (!ReadSections(changed.text)) return std::nullopt;
   return changed;
 }
 

@@ -7,9 +7,9 @@
 
 namespace platform {
 
-/// The integers and strings that a section of a TOML text holds; nothing where the text cannot be
+/// The integers and strings that the sections of a TOML text hold; nothing where the text cannot be
 /// understood.
-std::optional<CProfileSection> ReadSection(const std::string& text, const std::string& section);
+std::optional<CProfileSections> ReadSections(const std::string& text);
 
 struct ChangedText {
   std::string text;

@@ -2,6 +2,7 @@
 // a string behind a quotation mark. The browser lets no other page come between reading and
 // writing.
 
+#include <algorithm>
 #include <charconv>
 #include <cstdlib>
 #include <cstring>
@@ -40,46 +41,48 @@ class CWebProfile : public CProfile {
  public:
   explicit CWebProfile(std::string name) : m_strName(std::move(name)) {}
 
-  CProfileSection Read(const std::string& section) override;
+  std::optional<CProfileSections> Read() override;
   bool Update(const std::string& section, const Change& change) override;
 
  private:
-  std::string Beginning(const std::string& section) const {
-    return m_strName + "/" + section + "/";
-  }
-
   std::string m_strName;
 };
 
-CProfileSection CWebProfile::Read(const std::string& section) {
-  char* const stored = page_stored(Beginning(section).c_str());
+std::optional<CProfileSections> CWebProfile::Read() {
+  char* const stored = page_stored((m_strName + "/").c_str());
   if (stored == nullptr) {
     Tell(kKeepsNothing);
-    return {};
+    return std::nullopt;
   }
-  std::map<std::string, Value> values;
+  std::map<std::string, std::map<std::string, Value>> values;
   for (const char* at = stored; *at != '\0';) {
-    const std::string entry = at;
-    at += entry.size() + 1;
-    values[entry] = FromItem(at);
+    const std::string name = at;
+    at += name.size() + 1;
+    const std::size_t slash = std::min(name.find('/'), name.size() - 1);
+    values[name.substr(0, slash)][name.substr(slash + 1)] = FromItem(at);
     at += std::strlen(at) + 1;
   }
   std::free(stored);
-  return CProfileSection(std::move(values));
+  CProfileSections sections;
+  for (auto& [name, section] : values) sections.emplace(name, std::move(section));
+  return sections;
 }
 
 bool CWebProfile::Update(const std::string& section, const Change& change) {
-  CProfileSection values = Read(section);
+  std::optional<CProfileSections> sections = Read();
+  if (!sections) return false;
+  CProfileSection& values = (*sections)[section];
   change(values);
   std::string list;
   for (const auto& [entry, value] : values.Changes()) list += entry + '\0' + ToItem(value) + '\0';
-  const StoreResult result = page_store(Beginning(section).c_str(), list.c_str());
-  if (result == kStored) {
+  const std::string beginning = m_strName + "/" + section + "/";
+  const bool stored = page_store(beginning.c_str(), list.c_str()) != 0;
+  if (stored) {
     ForgetTold();
   } else {
-    Tell(result == kStoreFull ? kFull : kKeepsNothing);
+    Tell(kFull);
   }
-  return result == kStored;
+  return stored;
 }
 
 }  // namespace

@@ -8,10 +8,7 @@ extern "C" {
 /// browser keeps nothing for this page.
 char* page_stored(const char* beginning);
 
-/// What has become of values that were to be stored; the numbers are the script's too.
-enum StoreResult : int { kStored, kStoreFull, kStoreRefused };
-
-/// Stores such a list under names with this beginning: all of it, or nothing.
-StoreResult page_store(const char* beginning, const char* list);
+/// Stores such a list under names with this beginning: all of it, or nothing and 0.
+int page_store(const char* beginning, const char* list);
 
 }  // extern "C"

@@ -74,6 +74,7 @@ void CApplication::Dispatch(const Message& message) {
 void CApplication::OnIdle() {
   Refresh();
   TakeTroubles();
+  if (m_pMainFrame == nullptr) return;  // not before there is a table to be told at
   while (HasNotice() && !m_bQuit && !m_bShowingNotice && CanShowNotice()) {
     ShowNextNotice();
     Refresh();

@@ -37,7 +37,7 @@ class CApplication : public CCommandTarget {
   CScreen& Screen() { return m_screen; }
   CResources& Resources() { return m_resources; }
   /// Where the player's choices are kept; SetRegistryKey comes first.
-  CProfile& Profile() const { return *m_pProfile; }
+  CProfile& Profile() { return *m_pProfile; }
   /// Null until the main window is shown.
   CFrameWindow* MainFrame() const { return m_pMainFrame; }
 

@@ -15,8 +15,7 @@ void CScreen::Push(CTopWindow& window) {
 }
 
 void CScreen::Remove(CTopWindow& window) {
-  m_arrWindows.erase(std::remove(m_arrWindows.begin(), m_arrWindows.end(), &window),
-                     m_arrWindows.end());
+  if (std::erase(m_arrWindows, &window) == 0) return;
   if (m_pPressed != nullptr && &m_pPressed->TopLevel() == &window) m_pPressed = nullptr;
   MarkStale();
 }
@@ -125,14 +124,18 @@ void CScreen::Present() {
   const CBitmap& whole = Top()->Pixels();
   // The frame alone needs no other picture than its own.
   const bool alone = m_arrWindows.size() == 1 && TipText().empty();
-  if (alone && whole.GetSize() == m_size) return TheHost().Show(whole);
-  CBitmap pixels(m_size);
-  CSurface surface(pixels);
+  if (alone && whole.GetSize() == m_size) {
+    TheHost().Show(whole);
+    m_composed = {};
+    return;
+  }
+  m_composed = CBitmap(m_size);
+  CSurface surface(m_composed);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
   m_toolTip.Draw(surface);
-  TheHost().Show(pixels);
+  TheHost().Show(m_composed);
 }
 
 void CScreen::TakePressFrom(const CWindow& window) {

@@ -61,6 +61,7 @@ class CScreen {
   Size m_size;
   std::vector<CTopWindow*> m_arrWindows;
   CToolTipCtrl m_toolTip;
+  CBitmap m_composed;  ///< what is shown, while it is more than the frame
   bool m_bStale = true;
   CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
 };

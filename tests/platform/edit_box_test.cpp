@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "shell/res/dialog_templates.h"
 #include "tests/support/desk.h"
 #include "tests/support/golden.h"
 
@@ -26,7 +27,7 @@ class NameEdit : public testing::Test {
     for (const std::string& key : keys) m_desk.Host().PutKey(key);
     m_desk.Run();
   }
-  platform::CControl& Edit() { return *m_desk.Dialog()->GetDlgItem(6016); }
+  platform::CControl& Edit() { return *m_desk.Dialog()->GetDlgItem(kScoresName); }
   /// Where the host was told that the caret stands, within the edit.
   platform::Rect CaretPlace() {
     const platform::Rect place = m_desk.Host().TextPlace().value();

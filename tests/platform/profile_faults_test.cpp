@@ -6,11 +6,6 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <array>
-#include <csignal>
-#include <functional>
-#include <random>
-
 #include "tests/platform/failing_machine.h"
 #include "tests/platform/profile_helpers.h"
 
@@ -135,16 +130,6 @@ TEST_F(ProfileTest, WaitsNoMoreThanASecondForAGameThatHasStopped) {
   EXPECT_TRUE(Store("x", 3));
 }
 
-/// Runs a function in a process of its own.
-pid_t InChild(const std::function<void()>& run) {
-  const pid_t child = fork();
-  if (child == 0) {
-    run();
-    _exit(0);
-  }
-  return child;
-}
-
 TEST_F(ProfileTest, LosesNothingWhenTwoProgramsWriteAtOnce) {
   constexpr int kWrites = 100;
   const auto write = [this](const std::string& name) {
@@ -152,55 +137,14 @@ TEST_F(ProfileTest, LosesNothingWhenTwoProgramsWriteAtOnce) {
       while (!Store(name + std::to_string(i), i)) continue;  // the other one is too busy
     }
   };
-  const pid_t child = InChild([&] { write("child"); });
-  write("parent");
+  const pid_t child = fork();
+  write(child == 0 ? "child" : "parent");
+  if (child == 0) _exit(0);
   waitpid(child, nullptr, 0);
   for (int i = 0; i < kWrites; ++i) {
     EXPECT_EQ(GetInt("parent" + std::to_string(i)), i);
     EXPECT_EQ(GetInt("child" + std::to_string(i)), i);
   }
-}
-
-TEST_F(ProfileTest, IsTheOldOrTheNewOneWhenTheProgramIsKilled) {
-  const std::string a(20000, 'a');
-  const std::string b(20000, 'b');
-  const auto write = [this](const std::string& text) {
-    return m_pProfile->Update("S", [&](auto& section) {
-      section.Set("text", text);
-      section.Set("twin", text);
-    });
-  };
-  Store("other", 5);
-  write(a);
-  std::mt19937 random(11);
-  for (int i = 0; i < 50; ++i) {
-    std::array<int, 2> beat{};
-    ASSERT_EQ(pipe(beat.data()), 0);
-    const pid_t child = InChild([&] {
-      for (;;) {
-        for (const std::string& text : {b, a}) {
-          if (::write(beat[1], "x", 1) != 1) return;
-          write(text);
-        }
-      }
-    });
-    char sign = 0;
-    for (auto beats = 1 + random() % 4; beats > 0; --beats) {
-      ASSERT_EQ(read(beat[0], &sign, 1), 1);
-    }
-    // Somewhere in the midst of a write.
-    for (auto turns = random() % 200; turns > 0; --turns) sched_yield();
-    kill(child, SIGKILL);
-    waitpid(child, nullptr, 0);
-    close(beat[0]);
-    close(beat[1]);
-    const std::string text = GetString("text");
-    ASSERT_TRUE(text == a || text == b) << text.size();
-    ASSERT_EQ(GetString("twin"), text);
-    ASSERT_EQ(GetInt("other"), 5);
-    ASSERT_TRUE(write(a));  // nobody holds the lock
-  }
-  EXPECT_TRUE(KeptCopies().empty());
 }
 
 }  // namespace

@@ -13,10 +13,13 @@ class ProfileTest : public testing::Test {
   explicit ProfileTest(const std::string& name = "Program.toml")
       : m_file(m_folder.Path() / "Maker" / name) {}
 
+  platform::CProfileSection Read(const std::string& section) {
+    return m_pProfile->Read().value_or(platform::CProfileSections())[section];
+  }
   /// 7 where there is none.
-  int GetInt(const std::string& entry) { return m_pProfile->Read("S").GetInt(entry, 7); }
+  int GetInt(const std::string& entry) { return Read("S").GetInt(entry, 7); }
   std::string GetString(const std::string& entry) {
-    return m_pProfile->Read("S").GetString(entry, "absent");
+    return Read("S").GetString(entry, "absent");
   }
   template <class Value>
   bool Store(const std::string& entry, const Value& value) {

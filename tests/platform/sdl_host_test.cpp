@@ -36,6 +36,8 @@ CBitmap TellingFrame() {
 
 class SdlHostTest : public testing::Test {
  protected:
+  const CBitmap m_frame = TellingFrame();
+
   SdlHostTest() {
     SDL_SetHint(SDL_HINT_VIDEODRIVER, "dummy");
     std::string why;
@@ -219,7 +221,7 @@ bool IsSeenAt(const SDL_Surface& screen, Point at, Point inFrame) {
 }
 
 TEST_F(SdlHostTest, HitsWhatIsSeenAtEverySize) {
-  m_pHost->Show(TellingFrame());
+  m_pHost->Show(m_frame);
   for (int step = 0; step < 20; ++step) {
     const Size size{18 + 5 * step, 30 + 4 * step};
     SDL_SetWindowSize(Window(), size.width, size.height);
@@ -235,7 +237,7 @@ TEST_F(SdlHostTest, HitsWhatIsSeenAtEverySize) {
 }
 
 TEST_F(SdlHostTest, FillsTheDisplayAndComesBack) {
-  m_pHost->Show(TellingFrame());
+  m_pHost->Show(m_frame);
   const SDL_Keysym f11{SDL_SCANCODE_F11, SDLK_F11, 0, 0};
   PutKey(SDL_KEYDOWN, f11);
   PutKey(SDL_KEYDOWN, f11, 1);  // held down
@@ -249,7 +251,7 @@ TEST_F(SdlHostTest, FillsTheDisplayAndComesBack) {
 
 TEST_F(SdlHostTest, OpensWhereItIsPutAndTellsWhereItWasMoved) {
   m_pHost->SetWindowPlace({{5000, 100, 5300, 400}, false});
-  m_pHost->Show(TellingFrame());
+  m_pHost->Show(m_frame);
   const Rect opened = m_pHost->GetWindowPlace().value().rect;
   SDL_Rect display;
   SDL_GetDisplayBounds(0, &display);

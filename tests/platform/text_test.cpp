@@ -11,6 +11,7 @@
 #include <random>
 #include <set>
 
+#include "platform/draw/font_finder.h"
 #include "platform/draw/look.h"
 #include "platform/draw/utf8.h"
 #include "platform/draw/wrapped_text.h"
@@ -53,6 +54,22 @@ TEST(Text, IsWholeAgainAfterMemoryWasShort) {
     top += each.height + 2;
   }
   ExpectGolden(lines, "text_faces");
+}
+
+TEST(Text, TakesFromASecondFaceOnlyWhatTheFirstLacks) {
+  static std::u32string asked;
+  const auto find = [](char32_t character) {
+    asked += character;
+    return FontFile{character == U'\uF004' ? FELTSIDE_SECOND_FACE : "/no/such/face", 0};
+  };
+  const CBitmap box = RenderText({13}, "\u05D0");
+  SetFontFinder(find);
+  const CBitmap letter = RenderText({13}, "\uF004");
+  EXPECT_EQ(RenderText({13}, "\uF006"), box);
+  EXPECT_NE(RenderText({13}, "a\u00E9\uF004"), RenderText({13}, "a\u00E9\uF006"));
+  SetFontFinder(nullptr);
+  EXPECT_NE(letter, box);
+  EXPECT_EQ(asked, U"\uF004\uF006");
 }
 
 /// The texts in the sources of the game, and amounts of all kinds.

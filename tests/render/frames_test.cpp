@@ -37,50 +37,52 @@ int Before(int right, const std::string& text, int height) {
   return right - MeasureText(platform::Font{height}, text).width;
 }
 
-TEST(Frames, HaveEverythingAtItsPixels) {
+std::vector<PlacedFrame> PlacedFrames() {
   const int button = MeasureText({22}, "Play").width / 2;
   const int title = MeasureText({13, true}, "Player").width / 2;
-  const std::vector<PlacedFrame> frames = {
-      {"insurance",
-       {{"Dealer", kNormal, {Before(69, "Dealer", 11), 10}},
-        {"You", kNormal, {Before(69, "You", 11), 247}},
-        {"16", kTotal, {154, 247}},
-        {"Player", kBoxTitle, {66 - title, 97}},
-        {"Wallet: $100.00", kBox, {Before(110, "Wallet: $100.00", 13), 120}},
-        {"Current Bet: $5", kBox, {Before(110, "Current Bet: $5", 13), 138}}},
-       {{54, {79, 10}, {9, 41}},
-        {40, {88, 10}, {29, 41}},
-        {22, {79, 217}, {9, 41}},
-        {46, {88, 217}, {29, 41}},
-        {133, {168, 107}, {24, 22}},
-        {139, {56, 190}, {73, 17}},
-        {143, {130, 190}, {55, 17}}}},
-      {"eleven_advice",
-       {{"Basic Strategy says:", kAdvice, {125, 139}}, {"Double Down", kAdvice, {125, 157}}},
-       {}},
-      {"split_settled",
-       {{"21", kTotal, {94, 247}},
-        {"18", kTotal, {214, 247}},
-        {"25", kTotal, {154, 10}},
-        {"Winner!", kMessage, {19, 201}},
-        {"Winner!", kMessage, {139, 201}}},
-       {{141, {16, 97}, {13, 13}}}},
-      {"won", {{"Winner!", kResult, {79, 198}}}, {}},
-      {"plain_poker_marked",
-       {{"Royal Flush", kNormal, {5, 5}},
-        {"Straight", kNormal, {123, 17}},
-        {"Two Pair", kNormal, {123, 41}},
-        {"250", kNormal, {117 - MeasureText({11}, "888").width, 5}},
-        {"Play", kButton, {120 - button, 174}},
-        {"$99", kAmount, {Before(69, "$99", 11), 233}}},
-       {{43, {40, 114}, {29, 41}}, {54, {172, 114}, {29, 41}}}},
-      {"two_pair_kept",
-       {{"Deal", kCell, {103, 192}},
-        {"$101", kCell, {26, 233}},
-        {"Two Pair", kResultCell, {135, 235}}},
-       {}}};
+  return {{"insurance",
+           {{"Dealer", kNormal, {Before(69, "Dealer", 11), 10}},
+            {"You", kNormal, {Before(69, "You", 11), 247}},
+            {"16", kTotal, {154, 247}},
+            {"Player", kBoxTitle, {66 - title, 97}},
+            {"Wallet: $100.00", kBox, {Before(110, "Wallet: $100.00", 13), 120}},
+            {"Current Bet: $5", kBox, {Before(110, "Current Bet: $5", 13), 138}}},
+           {{54, {79, 10}, {9, 41}},
+            {40, {88, 10}, {29, 41}},
+            {22, {79, 217}, {9, 41}},
+            {46, {88, 217}, {29, 41}},
+            {133, {168, 107}, {24, 22}},
+            {139, {56, 190}, {73, 17}},
+            {143, {130, 190}, {55, 17}}}},
+          {"eleven_advice",
+           {{"Basic Strategy says:", kAdvice, {125, 139}}, {"Double Down", kAdvice, {125, 157}}},
+           {}},
+          {"split_settled",
+           {{"21", kTotal, {94, 247}},
+            {"18", kTotal, {214, 247}},
+            {"25", kTotal, {154, 10}},
+            {"Winner!", kMessage, {19, 201}},
+            {"Winner!", kMessage, {139, 201}}},
+           {{141, {16, 97}, {13, 13}}}},
+          {"won", {{"Winner!", kResult, {79, 198}}}, {}},
+          {"plain_poker_marked",
+           {{"Royal Flush", kNormal, {5, 5}},
+            {"Straight", kNormal, {123, 17}},
+            {"Two Pair", kNormal, {123, 41}},
+            {"250", kNormal, {117 - MeasureText({11}, "888").width, 5}},
+            {"Play", kButton, {120 - button, 174}},
+            {"$99", kAmount, {Before(69, "$99", 11), 233}}},
+           {{43, {40, 114}, {29, 41}}, {54, {172, 114}, {29, 41}}}},
+          {"two_pair_kept",
+           {{"Deal", kCell, {103, 192}},
+            {"$101", kCell, {26, 233}},
+            {"Two Pair", kResultCell, {135, 235}}},
+           {}}};
+}
+
+TEST(Frames, HaveEverythingAtItsPixels) {
   platform::CResources pictures(PictureFiles());
-  for (const PlacedFrame& placed : frames) {
+  for (const PlacedFrame& placed : PlacedFrames()) {
     const CBitmap table = TableOf(Play(placed.scene)->Shot());
     for (const PlacedText& text : placed.texts) {
       const auto places = PlacesOf(table, text.text, text.style);

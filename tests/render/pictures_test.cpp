@@ -103,8 +103,8 @@ TEST(Pictures, HaveCellsForTheTextsOfVideoPoker) {
   };
   for (const Cell& cell :
        {Cell{{97, 182, 138, 213}, Rgb(82, 23, 139), {103, 192}, {"Deal", "Play"}},
-        Cell{{3, 230, 116, 254}, Rgb(20, 71, 139), {26, 233}, {"$1000000", "$-1000000"}},
-        Cell{{124, 230, 237, 254},
+        Cell{{4, 230, 114, 254}, Rgb(20, 71, 139), {26, 233}, {"$1000000", "$-1000000"}},
+        Cell{{126, 230, 236, 254},
              Rgb(82, 115, 132),
              {135, 235},
              {"Three of a Kind", "Four of a Kind", "Straight Flush", "Royal Flush"}}}) {
@@ -113,7 +113,7 @@ TEST(Pictures, HaveCellsForTheTextsOfVideoPoker) {
         ASSERT_EQ(platform::ToColor(picture->At({x, y})), cell.color) << x << ", " << y;
       }
     }
-    constexpr int kClear = 2;  // around the text, so that it does not stand against an edge
+    constexpr int kClear = 3;  // around the text, so that it does not stand against an edge
     for (const std::string& text : cell.longest) {
       const Size size = platform::MeasureText({15, true}, text);
       EXPECT_GE(cell.text.x, cell.rect.left + kClear);

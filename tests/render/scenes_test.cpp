@@ -138,6 +138,7 @@ void CheckScene(const Scene& scene) {
 }
 
 TEST(Scenes, LookAsTheyDidAndCanBeRead) {
+  ASSERT_FALSE(Scenes().empty());
   for (const Scene& scene : Scenes()) {
     SCOPED_TRACE(scene.name);
     CheckScene(scene);

@@ -71,5 +71,23 @@ TEST(Settings, AreStoredEachAsItsOwn) {
   }
 }
 
+TEST(Settings, AreNotLostToTheDefaultsOfAFileThatCouldNotBeRead) {
+  Stylus stylus;
+  std::filesystem::create_directories(stylus.ProfileFile());
+  stylus.Send("key Ctrl+N");
+  stylus.Send("press 1");  // the box that tells
+  std::filesystem::remove(stylus.ProfileFile());
+  std::string stored = "[Settings]\n";
+  for (const Setting& each : kSettings) {
+    stored += each.name + " = " + std::to_string(each.lowest) + "\n";
+  }
+  WriteFile(stylus.ProfileFile(), stored);
+  stylus.Send("command table-setup");
+  const Json state = stylus.Send("press 1");
+  for (const Setting& each : kSettings) {
+    EXPECT_EQ(state.at(Json::json_pointer(each.member)), Held(each, each.lowest)) << each.name;
+  }
+}
+
 }  // namespace
 }  // namespace feltside::tests

@@ -11,7 +11,7 @@ namespace {
 
 using platform::WindowPlace;
 
-/// Closes the game and answers what its settings' file then holds.
+/// Closes the game and returns what its settings' file then holds.
 std::string FileAfter(Desk& desk) {
   const auto file = desk.Host().ProfileFolder() / "Quillworks" / "Feltside.toml";
   desk.Host().PutPointer(platform::InputKind::kClose, {});

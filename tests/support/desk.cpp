@@ -58,11 +58,11 @@ class ProgramThread {
 
 void DeskHost::Show(const platform::CBitmap& frame) {
   OffscreenHost::Show(frame);
-  if (m_onFrame) m_onFrame();
+  if (m_fnOnFrame) m_fnOnFrame();
 }
 
 void DeskHost::WaitEvent(int milliseconds) {
-  if (milliseconds >= 0 && m_onPause) m_onPause();
+  if (milliseconds >= 0 && m_fnOnPause) m_fnOnPause();
   OffscreenHost::WaitEvent(milliseconds);
 }
 

@@ -18,18 +18,22 @@ class DeskHost : private TemporaryFolder, public platform::OffscreenHost {
   ~DeskHost() override { platform::SetHost(&m_previous); }
 
   /// Called whenever the program waits for a time to pass.
-  void SetPauseHandler(std::function<void()> onPause) { m_onPause = std::move(onPause); }
+  void SetPauseHandler(std::function<void()> onPause) { m_fnOnPause = std::move(onPause); }
   /// Called after every picture that is shown.
-  void SetFrameHandler(std::function<void()> onFrame) { m_onFrame = std::move(onFrame); }
+  void SetFrameHandler(std::function<void()> onFrame) { m_fnOnFrame = std::move(onFrame); }
   void Show(const platform::CBitmap& frame) override;
   void WaitEvent(int milliseconds) override;
+  /// What keeps help viewers from coming up from now on.
+  void SetHelpTrouble(const std::string& trouble) { m_strHelpTrouble = trouble; }
+  std::string StartHelpViewer(const std::string&) override { return m_strHelpTrouble; }
   void PutPointer(platform::InputKind kind, platform::Point at);
   void PutKey(const std::string& chord);
 
  private:
   platform::Host& m_previous = platform::TheHost();
-  std::function<void()> m_onPause;
-  std::function<void()> m_onFrame;
+  std::function<void()> m_fnOnPause;
+  std::function<void()> m_fnOnFrame;
+  std::string m_strHelpTrouble;
 };
 
 /// The game in this process, worked with messages and input from one idle moment to the next, with
@@ -52,7 +56,7 @@ class Desk {
 
   /// Puts a message behind those that wait.
   static void Post(const platform::Message& message);
-  /// Lets the game handle all that waits; answers whether it still runs.
+  /// Lets the game handle all that waits; returns whether it still runs.
   bool Run();
   /// Both for a command.
   void Command(int commandID);

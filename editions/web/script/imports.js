@@ -56,6 +56,6 @@ mergeInto(LibraryManager.library, {
         list += lengthBytesUTF8(text) + 1;
       }
     }
-    return storage.write(UTF8ToString(beginning), texts);
+    return storage.write(UTF8ToString(beginning), texts) ? 1 : 0;
   },
 });

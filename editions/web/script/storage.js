@@ -1,10 +1,5 @@
 // What the browser keeps for the page: one item for a value.
 const storage = (function () {
-  // In the order of StoreResult.
-  const STORED = 0;
-  const FULL = 1;
-  const REFUSED = 2;
-
   /** Null where the browser keeps nothing. */
   function items() {
     try {
@@ -42,16 +37,15 @@ const storage = (function () {
         .join('');
     },
 
+    /** Stores such a list, split at the zero characters: all of it, or nothing and false. */
     write: function (beginning, list) {
-      const kept = items();
-      if (!kept) return REFUSED;
       const pairs = [];
       for (let i = 0; i + 1 < list.length; i += 2) pairs.push([beginning + list[i], list[i + 1]]);
       try {
-        putAll(kept, pairs);
-        return STORED;
+        putAll(items(), pairs);
+        return true;
       } catch (error) {
-        return FULL;
+        return false;
       }
     },
   };
