@@ -1,6 +1,6 @@
-#include "platform/host/create_host.h"
-
 #include <SDL.h>
+
+#include "platform/host/create_host.h"
 #ifdef __GLIBC__
 #include <malloc.h>
 #endif
