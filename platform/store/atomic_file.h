@@ -27,8 +27,8 @@ class CFileLock {
 };
 
 /// Writes a new file beside the old one, with the old one's permissions where those are not the
-/// folder's, flushes it to the disk and renames it over the old one. Answers what went wrong, if anything did; then, as with a file that
-/// may not be written, the old file is as it was.
+/// folder's, flushes it to the disk and renames it over the old one. Answers what went wrong, if
+/// anything did; then, as with a file that may not be written, the old file is as it was.
 std::error_code WriteWhole(const std::filesystem::path& file, const std::string& text);
 
 }  // namespace platform
