@@ -94,12 +94,17 @@ def notice():
 
 
 def copy_sources():
-    shutil.rmtree(PLACE / "source", ignore_errors=True)
+    """Brings the copy up to date; what is the same stays as old as it is, and is not built again."""
     files = subprocess.run(["git", "ls-files", "-z"], cwd=ROOT, capture_output=True, check=True)
-    for name in files.stdout.decode().split("\0"):
-        if name and (ROOT / name).is_file():
-            (PLACE / "source" / name).parent.mkdir(parents=True, exist_ok=True)
-            shutil.copy2(ROOT / name, PLACE / "source" / name)
+    names = [name for name in files.stdout.decode().split("\0") if name and (ROOT / name).is_file()]
+    copies = {PLACE / "source" / name: ROOT / name for name in names}
+    for copy, original in copies.items():
+        if not copy.is_file() or copy.read_bytes() != original.read_bytes():
+            copy.parent.mkdir(parents=True, exist_ok=True)
+            shutil.copy(original, copy)
+    for stray in (PLACE / "source").rglob("*"):
+        if stray.is_file() and stray not in copies:
+            stray.unlink()
 
 
 def try_out(path, number, fault):
