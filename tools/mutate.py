@@ -96,8 +96,8 @@ def notice():
 def copy_sources():
     """Brings the copy up to date; what is the same stays as old as it is, and is not built again."""
     files = subprocess.run(["git", "ls-files", "-z"], cwd=ROOT, capture_output=True, check=True)
-    names = [name for name in files.stdout.decode().split("\0") if name and (ROOT / name).is_file()]
-    copies = {PLACE / "source" / name: ROOT / name for name in names}
+    copies = {PLACE / "source" / name: ROOT / name
+              for name in files.stdout.decode().split("\0") if (ROOT / name).is_file()}
     for copy, original in copies.items():
         if not copy.is_file() or copy.read_bytes() != original.read_bytes():
             copy.parent.mkdir(parents=True, exist_ok=True)
