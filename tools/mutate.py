@@ -94,7 +94,7 @@ def notice():
 
 
 def copy_sources():
-    """Brings the copy up to date; what is the same stays as old as it is, and is not built again."""
+    """Brings the copy up to date; what is the same stays as old as it is and is not built anew."""
     files = subprocess.run(["git", "ls-files", "-z"], cwd=ROOT, capture_output=True, check=True)
     copies = {PLACE / "source" / name: ROOT / name
               for name in files.stdout.decode().split("\0") if (ROOT / name).is_file()}
