@@ -12,6 +12,7 @@ fault that nobody can see: that is for a person to say.
 import argparse
 import random
 import re
+import resource
 import shutil
 import subprocess
 import sys
@@ -26,6 +27,7 @@ CONFIGURE = ["cmake", "-G", "Ninja", "-S", "source", "-B", "build", "-DCMAKE_BUI
 # The short tests first: most faults are found in a few seconds.
 TESTS = ["engine|shell|render|platform", "^play$|fuzz|store", "play-random-0"]
 TEST_SECONDS = 240
+MOST_MEMORY = 4 << 30  # bytes; some faults make an endless loop of something that grows
 
 SWAPS = [("==", "!="), ("<=", "<"), (">=", ">"), ("&&", "||"), ("||", "&&"), ("true", "false"),
          ("false", "true"), (" < ", " <= "), (" > ", " >= "), (" + ", " - "), (" - ", " + "),
@@ -75,9 +77,12 @@ def all_faults(folders):
 
 def run(*command, seconds=None):
     """Whether a command ended well, in time."""
+    def limit_memory():
+        resource.setrlimit(resource.RLIMIT_AS, (MOST_MEMORY, MOST_MEMORY))
     try:
         return subprocess.run(command, cwd=PLACE, stdout=subprocess.DEVNULL, timeout=seconds,
-                              stderr=subprocess.DEVNULL, check=False).returncode == 0
+                              stderr=subprocess.DEVNULL, preexec_fn=limit_memory,
+                              check=False).returncode == 0
     except subprocess.TimeoutExpired:
         return False
 
