@@ -12,7 +12,7 @@ namespace feltside::bench {
 namespace {
 
 std::filesystem::path NewFolder(const std::string& settings) {
-  const auto folder =
+  auto folder =
       std::filesystem::temp_directory_path() / ("feltside-bench-" + std::to_string(getpid()));
   std::filesystem::create_directories(folder / "Quillworks");
   std::ofstream(folder / "Quillworks" / "Feltside.toml") << "[Settings]\n" << settings;

@@ -52,8 +52,9 @@ void Shuffle(benchmark::State& state) {
 }
 
 void Text(benchmark::State& state) {
-  for (auto _ : state)
+  for (auto _ : state) {
     benchmark::DoNotOptimize(platform::RenderText({13, false}, "Wallet: $100.00"));
+  }
 }
 
 void Decode(benchmark::State& state, int number) {
@@ -63,7 +64,7 @@ void Decode(benchmark::State& state, int number) {
 
 /// A file as the game leaves it after a while.
 std::filesystem::path ProfileFile() {
-  const auto file = std::filesystem::temp_directory_path() / "feltside-bench-profile" / "p.toml";
+  auto file = std::filesystem::temp_directory_path() / "feltside-bench-profile" / "p.toml";
   const auto profile = platform::OpenProfile(file);
   profile->Update("Settings", [](platform::CProfileSection& section) {
     for (const char* name : {"GAME_TYPE", "USEHIGH", "FANCYVP", "FANCYBJ", "CARDBACK", "TABLECOLOR",

@@ -7,7 +7,7 @@
 namespace feltside::fuzz {
 
 std::string CBytes::Take(std::size_t count) {
-  const std::string taken = AtEnd() ? "" : m_bytes.substr(m_nAt, count);
+  std::string taken = AtEnd() ? "" : m_bytes.substr(m_nAt, count);
   m_nAt += taken.size();
   return taken;
 }

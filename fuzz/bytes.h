@@ -33,3 +33,6 @@ class CBytes {
 void Require(bool holds, const std::string& what);
 
 }  // namespace feltside::fuzz
+
+/// What each target is: takes one input, returns 0.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);

@@ -1,13 +1,27 @@
 // Takes a fuzz target through the files of some folders, in place of the fuzzer.
 
 #include <algorithm>
+#include <exception>
 #include <filesystem>
 #include <iostream>
 #include <vector>
 
+#include "fuzz/bytes.h"
 #include "tests/support/temporary_folder.h"
 
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);
+namespace {
+
+bool Take(const std::string& bytes) {
+  try {
+    LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
+    return true;
+  } catch (const std::exception& error) {
+    std::cerr << error.what() << '\n';
+    return false;
+  }
+}
+
+}  // namespace
 
 int main(int argc, char** argv) {
   std::vector<std::filesystem::path> files;
@@ -19,8 +33,7 @@ int main(int argc, char** argv) {
   std::sort(files.begin(), files.end());
   for (const auto& file : files) {
     std::cout << file.filename().string() << std::endl;  // the last one named is the culprit
-    const std::string bytes = feltside::tests::ReadFile(file);
-    LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
+    if (!Take(feltside::tests::ReadFile(file))) return 1;
   }
   return files.empty() ? 1 : 0;
 }

@@ -187,12 +187,8 @@ class Breaker:
         answered = len(answers.splitlines())
         steps = answered // step_length + (answered % step_length >= 3)
         expected = [*values[max(steps - 1, 0):steps + 1], *([None] if steps == 0 else [])]
-        outcome = "lost"
-        if settings is not None and settings.get(name) in expected:
-            outcome = "stored"
-        elif settings is not None and was_told(answers):
-            outcome = "told"
-        self.note("killed, one of two", outcome,
+        kept = settings is not None and settings.get(name) in expected
+        self.note("killed, one of two", "stored" if kept else "lost",
                   f"{name} = {settings and settings.get(name)} after {steps} steps")
 
     def report(self):

@@ -110,7 +110,7 @@ def with_places(findings, path, starts):
 
 def look_at(files, flags, path):
     """The findings in some files, which are put together at the path."""
-    is_test = files[0].startswith("tests/")
+    is_test = files[0].startswith(("bench/", "fuzz/", "tests/"))
     if len(files) == 1:
         return look(ROOT / files[0], flags, is_test)
     starts = write_as_one(files, path)

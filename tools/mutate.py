@@ -12,6 +12,7 @@ fault that nobody can see: that is for a person to say.
 import argparse
 import random
 import re
+import resource
 import shutil
 import subprocess
 import sys
@@ -26,6 +27,7 @@ CONFIGURE = ["cmake", "-G", "Ninja", "-S", "source", "-B", "build", "-DCMAKE_BUI
 # The short tests first: most faults are found in a few seconds.
 TESTS = ["engine|shell|render|platform", "^play$|fuzz|store", "play-random-0"]
 TEST_SECONDS = 240
+MOST_MEMORY = 4 << 30  # bytes; some faults make an endless loop of something that grows
 
 SWAPS = [("==", "!="), ("<=", "<"), (">=", ">"), ("&&", "||"), ("||", "&&"), ("true", "false"),
          ("false", "true"), (" < ", " <= "), (" > ", " >= "), (" + ", " - "), (" - ", " + "),
@@ -75,9 +77,12 @@ def all_faults(folders):
 
 def run(*command, seconds=None):
     """Whether a command ended well, in time."""
+    def limit_memory():
+        resource.setrlimit(resource.RLIMIT_AS, (MOST_MEMORY, MOST_MEMORY))
     try:
         return subprocess.run(command, cwd=PLACE, stdout=subprocess.DEVNULL, timeout=seconds,
-                              stderr=subprocess.DEVNULL, check=False).returncode == 0
+                              stderr=subprocess.DEVNULL, preexec_fn=limit_memory,
+                              check=False).returncode == 0
     except subprocess.TimeoutExpired:
         return False
 
@@ -94,12 +99,17 @@ def notice():
 
 
 def copy_sources():
-    shutil.rmtree(PLACE / "source", ignore_errors=True)
+    """Brings the copy up to date; what is the same stays as old as it is and is not built anew."""
     files = subprocess.run(["git", "ls-files", "-z"], cwd=ROOT, capture_output=True, check=True)
-    for name in files.stdout.decode().split("\0"):
-        if name and (ROOT / name).is_file():
-            (PLACE / "source" / name).parent.mkdir(parents=True, exist_ok=True)
-            shutil.copy2(ROOT / name, PLACE / "source" / name)
+    copies = {PLACE / "source" / name: ROOT / name
+              for name in files.stdout.decode().split("\0") if (ROOT / name).is_file()}
+    for copy, original in copies.items():
+        if not copy.is_file() or copy.read_bytes() != original.read_bytes():
+            copy.parent.mkdir(parents=True, exist_ok=True)
+            shutil.copy(original, copy)
+    for stray in (PLACE / "source").rglob("*"):
+        if stray.is_file() and stray not in copies:
+            stray.unlink()
 
 
 def try_out(path, number, fault):

@@ -9,6 +9,7 @@ namespace {
 constexpr std::size_t kMostDots = 32;    ///< in one key
 constexpr std::size_t kMostNested = 64;  ///< arrays and inline tables in one another
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::string_view kValueEnds = " \t\r\n,]}#";
 constexpr std::size_t kNowhere = std::string_view::npos;
 
 bool IsAscii(char c) { return static_cast<unsigned char>(c) < 0x80; }
@@ -41,6 +42,14 @@ std::size_t EndOfString(std::string_view text, std::size_t begin) {
   return at;
 }
 
+/// Whether a blank and a single digit follow a value, which is never right. Behind a date the
+/// parser takes them for a time, and runs over the end of the line.
+bool HasLoneDigitBehind(std::string_view text, std::size_t end) {
+  const std::string_view behind = end < text.size() ? text.substr(end, 3) : "";
+  return behind.size() == 3 && behind[0] == ' ' && Contains("0123456789", behind[1]) &&
+         Contains(kValueEnds, behind[2]);
+}
+
 /// Goes through a text as the parser does, but only so far as to know where a key is expected and
 /// where a value, since a quotation mark in the midst of a value begins no string.
 class CTomlScan {
@@ -65,10 +74,10 @@ class CTomlScan {
       m_nAt = EndOfString(m_strText, m_nAt);
       return m_nAt != kNowhere;
     } else if (m_bValue && !Contains(" \t\r\n,[]{}=", c)) {
-      const std::size_t end = m_strText.find_first_of(" \t\r\n,]}#", m_nAt);
+      const std::size_t end = m_strText.find_first_of(kValueEnds, m_nAt);
       const std::string_view value = m_strText.substr(m_nAt, end - m_nAt);
       m_nAt = end;
-      return std::all_of(value.begin(), value.end(), IsAscii);
+      return std::all_of(value.begin(), value.end(), IsAscii) && !HasLoneDigitBehind(m_strText, end);
     } else {
       Pass(c);
       ++m_nAt;

@@ -53,6 +53,7 @@ TEST_F(ProfileTest, TellsOfATroubleOnceUntilItIsOver) {
 }
 
 TEST_F(ProfileTest, LeavesTheFileThatCannotBeReadOrWritten) {
+  WriteFile(m_file.string() + ".new", "what a killed game has left");
   for (bool* fails : {&g_bReadFails, &g_bFlushFails}) {
     EXPECT_TRUE(Store("x", 1));
     *fails = true;

@@ -60,18 +60,6 @@ TEST(Surface, DrawsInsideItsBoundsAndThePictureOnly) {
   }
 }
 
-TEST(Surface, ClipsTextToItsRectangleAndThePartToTheWhole) {
-  CBitmap bitmap({60, 20}, kGround);
-  const CSurface whole(bitmap, {0, 0, 40, 20});
-  CSurface part(whole, {15, 2, 60, 20});
-  part.SetTextColor(kInk);
-  part.SetBackColor(kInk);
-  part.DrawText({5, 3, 45, 10}, "HHHHHHHHHHHHHHHH", TextAlign::kRight);
-  CBitmap expected({60, 20}, kGround);
-  CSurface(expected).FillRect({20, 5, 40, 12}, kInk);
-  EXPECT_EQ(Letters(bitmap), Letters(expected));
-}
-
 TEST(Resources, ShowABlankWithItsNumberForAPictureThatIsMissing) {
   CResources none({nullptr, 0});
   CBitmap expected({29, 41});
