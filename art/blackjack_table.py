@@ -31,8 +31,8 @@ _MEDALLION = (180, 118)
 _BAND_TOP, _PLAYERS_LINE = 862, 986
 _CLOTH_INK = 8
 _INSIDE_FRAME = 4
-# Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie beside
-# them.
+# Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie
+# beside them.
 _TRAYS = ((10, 6, 230, 55), (10, 213, 230, 262))
 _TRAY_INK = 3
 
@@ -120,7 +120,9 @@ def _lay_letter(paper, letter, place, width):
 def _bare(x, y):
     """Whether a small suit of the cloth has room at a point."""
     radius = _arc_radius(x, y)
-    if radius < _BAND_TOP + 36 or abs(radius - _PLAYERS_LINE) < 8 or shapes.disc(*_MEDALLION, 33)(x, y):
+    if radius < _BAND_TOP + 36 or abs(radius - _PLAYERS_LINE) < 8:
+        return False
+    if shapes.disc(*_MEDALLION, 33)(x, y):
         return False
     return 14 < x < WIDTH - 14 and y < _TRAYS[1][1] - 8
 
@@ -153,7 +155,8 @@ def _lay_tray(paper, tray):
     left, top, right, bottom = tray
     outer = _rounded(left, top, right, bottom, 5)
     paper.lay(outer, _TRAY_INK, tray)
-    paper.lay(_outline(outer, _rounded(left + 1, top + 1, right - 1, bottom - 1, 4)), INK_LIMIT, tray)
+    inner = _rounded(left + 1, top + 1, right - 1, bottom - 1, 4)
+    paper.lay(_outline(outer, inner), INK_LIMIT, tray)
 
 
 def _lay_frame(paper):
@@ -164,7 +167,8 @@ def _lay_frame(paper):
 def blackjack_table():
     paper = Paper()
     _lay_cloth(paper)
-    for offset, width, ink in ((0, 1, 18), (2.5, 1.5, INK_LIMIT), (25, 1.5, INK_LIMIT), (28, 1, 18)):
+    for offset, width, ink in ((0, 1, 18), (2.5, 1.5, INK_LIMIT),
+                               (25, 1.5, INK_LIMIT), (28, 1, 18)):
         paper.lay(_arc(_BAND_TOP + offset, _BAND_TOP + offset + width), ink)
     for offset, width, ink in ((-2, 1.2, 22), (1, 1, 14)):
         paper.lay(_arc(_PLAYERS_LINE + offset, _PLAYERS_LINE + offset + width), ink)

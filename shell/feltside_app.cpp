@@ -60,9 +60,9 @@ int CFeltsideApp::ExitInstance() {
 }
 
 const platform::CProfileSection& CFeltsideApp::ReadSettings() {
-  const auto stored = Profile().Read();
+  auto stored = Profile().Read();
   m_bReadSettings = stored.has_value();
-  m_mapStored = stored.value_or(platform::CProfileSections());
+  m_mapStored = std::move(stored).value_or(platform::CProfileSections());
   return m_mapStored[kSettingsSection];
 }
 

@@ -1,9 +1,9 @@
-#include "platform/host/profile_folder.h"
-
 #include <pwd.h>
 #include <unistd.h>
 
 #include <cstdlib>
+
+#include "platform/host/profile_folder.h"
 
 namespace platform {
 namespace {

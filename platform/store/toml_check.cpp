@@ -77,7 +77,8 @@ class CTomlScan {
       const std::size_t end = m_strText.find_first_of(kValueEnds, m_nAt);
       const std::string_view value = m_strText.substr(m_nAt, end - m_nAt);
       m_nAt = end;
-      return std::all_of(value.begin(), value.end(), IsAscii) && !HasLoneDigitBehind(m_strText, end);
+      return std::all_of(value.begin(), value.end(), IsAscii) &&
+             !HasLoneDigitBehind(m_strText, end);
     } else {
       Pass(c);
       ++m_nAt;

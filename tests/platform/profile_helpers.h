@@ -13,13 +13,16 @@ class ProfileTest : public testing::Test {
   explicit ProfileTest(const std::string& name = "Program.toml")
       : m_file(m_folder.Path() / "Maker" / name) {}
 
-  platform::CProfileSection Read(const std::string& section) {
-    return m_pProfile->Read().value_or(platform::CProfileSections())[section];
-  }
+  // Without memory for anything of their own, as that may be what is short.
+
   /// 7 where there is none.
-  int GetInt(const std::string& entry) { return Read("S").GetInt(entry, 7); }
+  int GetInt(const std::string& entry, const std::string& section = "S") {
+    auto sections = m_pProfile->Read();
+    return sections && sections->contains(section) ? (*sections)[section].GetInt(entry, 7) : 7;
+  }
   std::string GetString(const std::string& entry) {
-    return Read("S").GetString(entry, "absent");
+    auto sections = m_pProfile->Read();
+    return sections ? (*sections)["S"].GetString(entry, "absent") : "absent";
   }
   template <class Value>
   bool Store(const std::string& entry, const Value& value) {

@@ -23,7 +23,7 @@ TEST_F(ProfileTest, BringsIntegersBack) {
     EXPECT_TRUE(Store("value", value));
     EXPECT_EQ(GetInt("value"), value);
     EXPECT_EQ(GetString("value"), "absent");
-    EXPECT_EQ(Read("T").GetInt("value", 7), 7);
+    EXPECT_EQ(GetInt("value", "T"), 7);
   }
 }
 
@@ -145,7 +145,8 @@ TEST_F(ProfileTest, LivesWithAFileCutOffAnywhere) {
   for (std::size_t length = 0; length < whole.size(); ++length) {
     const std::size_t copies = KeptCopies().size();
     WriteFile(m_file, whole.substr(0, length));
-    const std::string color = std::to_string(Read("S").GetInt("TABLECOLOR", 39680));
+    const std::string color =
+        std::to_string((*m_pProfile->Read())["S"].GetInt("TABLECOLOR", 39680));
     EXPECT_EQ(std::string("39680").rfind(color, 0), 0U) << length;
     const std::string name = GetString("High0");
     EXPECT_TRUE(name == "absent" || name == "A \"name\" 120") << length << ": " << name;
