@@ -1,5 +1,3 @@
-#include "platform/store/atomic_file.h"
-
 #include <fcntl.h>
 #include <sys/file.h>
 #include <sys/stat.h>
@@ -7,6 +5,8 @@
 
 #include <cerrno>
 #include <cstdio>
+
+#include "platform/store/atomic_file.h"
 
 namespace platform {
 namespace {
