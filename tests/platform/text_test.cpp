@@ -43,7 +43,7 @@ TEST(Text, IsWholeAgainAfterMemoryWasShort) {
       EXPECT_EQ(RenderText(font, "V").GetSize().height, font.height);
       refused = std::exchange(g_nBeforeRefusal, -1) <= 0;
     }
-    EXPECT_GT(tries, 65);  // in so many pieces a face and a glyph are read
+    EXPECT_GT(tries, 45);  // in so many pieces, at least, a face and a glyph are read
   }
   CBitmap lines({230, 170}, kWhite);
   CSurface surface(lines);

@@ -84,8 +84,9 @@ std::vector<Point> PlacesOf(const CBitmap& shot, const Stencil& stencil, Color c
     };
     if (isColored(stencil.beside.front())) continue;  // amid an area of the colour
     if (!std::all_of(stencil.ink.rbegin(), stencil.ink.rend(), isColored)) continue;
-    const long more = std::count_if(stencil.beside.begin(), stencil.beside.end(), isColored) +
-                      std::count_if(stencil.apart.begin(), stencil.apart.end(), isColored);
+    const std::ptrdiff_t more =
+        std::count_if(stencil.beside.begin(), stencil.beside.end(), isColored) +
+        std::count_if(stencil.apart.begin(), stencil.apart.end(), isColored);
     if (4 * more <= others) places.push_back(at);
   }
   return places;

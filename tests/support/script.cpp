@@ -169,7 +169,7 @@ class Player {
 std::vector<std::string> ScriptNames() {
   std::vector<std::string> names;
   for (const auto& entry : std::filesystem::directory_iterator(FELTSIDE_SCRIPTS_FOLDER)) {
-    if (entry.path().extension() == ".txt") names.push_back(entry.path().stem());
+    if (entry.path().extension() == ".txt") names.push_back(entry.path().stem().string());
   }
   std::sort(names.begin(), names.end());
   return names;

@@ -1,13 +1,11 @@
 #pragma once
 
-#include <sys/types.h>
-
-#include <cstdio>
 #include <filesystem>
 #include <nlohmann/json.hpp>
 #include <string>
 
 #include "platform/draw/bitmap.h"
+#include "tests/support/child.h"
 #include "tests/support/temporary_folder.h"
 
 namespace feltside::tests {
@@ -33,13 +31,11 @@ class Stylus {
   /// The whole window.
   platform::CBitmap Shot();
   /// What the program has said on its error stream so far.
-  std::string Errors() const { return ReadFile(m_folder.Path() / "errors"); }
+  std::string Errors() const;
 
  private:
   TemporaryFolder m_folder;
-  pid_t m_process = 0;
-  std::FILE* m_pToProgram = nullptr;
-  std::FILE* m_pFromProgram = nullptr;
+  Child m_program{};
 };
 
 }  // namespace feltside::tests

@@ -1,9 +1,8 @@
 #include "tests/support/temporary_folder.h"
 
-#include <cstdlib>
 #include <fstream>
+#include <random>
 #include <sstream>
-#include <stdexcept>
 #include <string>
 #include <system_error>
 
@@ -12,9 +11,10 @@ namespace feltside::tests {
 namespace fs = std::filesystem;
 
 TemporaryFolder::TemporaryFolder() {
-  std::string name = (fs::temp_directory_path() / "feltside-test-XXXXXX").string();
-  if (mkdtemp(name.data()) == nullptr) throw std::runtime_error("no temporary folder");
-  m_path = name;
+  std::random_device random;
+  do {
+    m_path = fs::temp_directory_path() / ("feltside-test-" + std::to_string(random()));
+  } while (!fs::create_directory(m_path));
 }
 
 TemporaryFolder::~TemporaryFolder() {

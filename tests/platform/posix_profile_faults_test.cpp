@@ -96,6 +96,15 @@ TEST_F(ProfileTest, StoresAllOrNothingWhenMemoryRunsOut) {
   }
 }
 
+TEST_F(ProfileTest, KeepsThePermissionsOfTheFile) {
+  constexpr auto kPermissions =
+      fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read;
+  WriteFile(m_file, "[S]\nx = 1\n");
+  fs::permissions(m_file, kPermissions);
+  EXPECT_TRUE(Store("x", 2));
+  EXPECT_EQ(fs::status(m_file).permissions(), kPermissions);
+}
+
 class LongNameTest : public ProfileTest {
  protected:
   /// Too long for anything behind it but ".new" and ".lock".
@@ -129,23 +138,6 @@ TEST_F(ProfileTest, WaitsNoMoreThanASecondForAGameThatHasStopped) {
   g_bSleepsInNoTime = false;
   close(lock);
   EXPECT_TRUE(Store("x", 3));
-}
-
-TEST_F(ProfileTest, LosesNothingWhenTwoProgramsWriteAtOnce) {
-  constexpr int kWrites = 100;
-  const auto write = [this](const std::string& name) {
-    for (int i = 0; i < kWrites; ++i) {
-      while (!Store(name + std::to_string(i), i)) continue;  // the other one is too busy
-    }
-  };
-  const pid_t child = fork();
-  write(child == 0 ? "child" : "parent");
-  if (child == 0) _exit(0);
-  waitpid(child, nullptr, 0);
-  for (int i = 0; i < kWrites; ++i) {
-    EXPECT_EQ(GetInt("parent" + std::to_string(i)), i);
-    EXPECT_EQ(GetInt("child" + std::to_string(i)), i);
-  }
 }
 
 }  // namespace

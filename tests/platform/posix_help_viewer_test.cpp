@@ -1,12 +1,11 @@
 // The help viewer, with an opener of the test's own in the path.
 
-#include "platform/host/help_viewer.h"
-
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
 #include <cstdlib>
 
+#include "platform/host/help_viewer.h"
 #include "tests/support/temporary_folder.h"
 
 namespace feltside::tests {
