@@ -129,8 +129,9 @@ void CScreen::Present() {
     m_composed = {};
     return;
   }
-  m_composed = CBitmap(m_size);
+  if (m_composed.GetSize() != m_size) m_composed = CBitmap(m_size);
   CSurface surface(m_composed);
+  surface.FillRect(surface.Bounds(), kBlack);
   for (const CTopWindow* window : m_arrWindows) {
     surface.BitBlt(window->GetPlace().TopLeft(), window->Pixels().GetSize(), window->Pixels());
   }
