@@ -20,14 +20,16 @@ constexpr char kUsage[] =
 
 std::optional<int> AnswerCommandLine(int argc, char** argv) {
   if (argc < 2) return std::nullopt;
-  const std::string_view word = argv[1];
-  if (word == "--help") {
-    std::fputs(kUsage, stdout);
-  } else if (word == "--version") {
-    std::puts("Feltside " FELTSIDE_VERSION);
-  } else {
-    std::fprintf(stderr, "feltside: no such option: %s\nTry \"feltside --help\".\n", argv[1]);
+  for (int i = 1; i < argc; ++i) {
+    const std::string_view word = argv[i];
+    if (word == "--help" || word == "--version") continue;
+    std::fprintf(stderr, "feltside: no such option: %s\nTry \"feltside --help\".\n", argv[i]);
     return kExitRefused;
+  }
+  if (argv[1] == std::string_view("--help")) {
+    std::fputs(kUsage, stdout);
+  } else {
+    std::puts("Feltside " FELTSIDE_VERSION);
   }
   return EXIT_SUCCESS;
 }

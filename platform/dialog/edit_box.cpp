@@ -198,7 +198,8 @@ bool CEditBox::OnChar(const std::string& text) {
 }
 
 bool CEditBox::OnComposition(const std::string& text) {
-  if (m_nCaret != m_nAnchor) Insert("");
+  // An input method that only goes away says so with nothing.
+  if (!text.empty() && m_nCaret != m_nAnchor) Insert("");
   m_strComposition = OneLine(text);
   ScrollToCaret();
   return true;

@@ -9,12 +9,14 @@
 namespace platform {
 namespace {
 
+constexpr char kXLibrary[] = "libX11.so.6";
+
 /// What is needed of the X library, which SDL too loads only where the desktop is one of X.
 class XLibrary : public SdlLibrary {
  public:
   /// For the screen of a window, which need not be the display's first.
   explicit XLibrary(const SDL_SysWMinfo& window)
-      : SdlLibrary("libX11.so.6"),
+      : SdlLibrary(kXLibrary),
         m_pDisplay(window.info.x11.display),
         m_window(window.info.x11.window) {
     Load(m_pInternAtom, "XInternAtom");
@@ -91,6 +93,18 @@ Rect StillThere(SDL_Window* window, const Rect& part) {
   if (!library.IsComplete()) return part;
   const XWindowAttributes root = library.Root();
   return part.Intersection(RectAt({}, {root.width, root.height}));
+}
+
+DesktopPatience::DesktopPatience() {
+  m_library.emplace(kXLibrary);
+  decltype(XSetErrorHandler)* setErrorHandler = nullptr;
+  m_library->Load(setErrorHandler, "XSetErrorHandler");
+  if (setErrorHandler == nullptr) return;
+  static XErrorHandler otherwise = nullptr;
+  const XErrorHandler before = setErrorHandler([](Display* display, XErrorEvent* error) {
+    return error->error_code == BadWindow ? 0 : otherwise(display, error);
+  });
+  if (otherwise == nullptr) otherwise = before;
 }
 
 }  // namespace platform

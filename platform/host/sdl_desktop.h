@@ -2,7 +2,10 @@
 
 #include <SDL.h>
 
+#include <optional>
+
 #include "platform/draw/geometry.h"
+#include "platform/host/sdl_library.h"
 
 namespace platform {
 
@@ -16,5 +19,16 @@ bool KnowsFullScreen(SDL_Window* window);
 /// What of a part of the desktop is there now. SDL keeps the sizes of the displays that it has seen
 /// at first.
 Rect StillThere(SDL_Window* window, const Rect& part);
+
+/// Has the desktop put up with words about a window that has gone: SDL wakes itself up through its
+/// window by a connection of its own, which is late at times, and X would end the program for it.
+/// Made before SDL's video begins, gone after it has ended.
+class DesktopPatience {
+ public:
+  DesktopPatience();
+
+ private:
+  std::optional<SdlLibrary> m_library;  ///< the desktop's
+};
 
 }  // namespace platform

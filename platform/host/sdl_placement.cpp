@@ -65,9 +65,17 @@ Rect SdlPlacement::OnDesktop(const Rect& rect) const {
   const auto onto = [this, &rect](Bounds* boundsOf) {
     std::vector<Rect> displays = Displays(boundsOf);
     for (Rect& display : displays) display = StillThere(m_pWindow, display);
+    std::erase_if(displays, [](const Rect& display) { return display.IsEmpty(); });
     return MovedOnto(displays, rect);
   };
   return onto(SDL_GetDisplayBounds) == rect ? rect : onto(SDL_GetDisplayUsableBounds);
+}
+
+Rect SdlPlacement::OnDesktopWithBar(Rect inside) const {
+  inside.top -= BarHeight();
+  Rect moved = OnDesktop(inside);
+  moved.top += BarHeight();
+  return moved;
 }
 
 void SdlPlacement::PutAt(const Rect& rect) {
@@ -89,7 +97,7 @@ void SdlPlacement::Show() {
   SDL_ShowWindow(m_pWindow);
   SDL_PumpEvents();
   m_rcOpened = CurrentRect();
-  const Rect inside = OnDesktop(m_rcOpened);
+  const Rect inside = OnDesktopWithBar(m_rcOpened);
   if (inside != m_rcOpened) PutAt(inside);
   m_rcNormal = CurrentRect();
   if (m_bOpensMaximized) SDL_MaximizeWindow(m_pWindow);
@@ -146,10 +154,7 @@ void SdlPlacement::EnterFullScreen() {
 /// large as the display.
 void SdlPlacement::LeaveFullScreen() {
   const Rect display = CurrentRect();
-  Rect back = m_rcNormal;
-  back.top -= BarHeight();
-  back = OnDesktop(back);
-  back.top += BarHeight();
+  const Rect back = OnDesktopWithBar(m_rcNormal);
   if (!m_bFillsDisplay) SDL_SetWindowFullscreen(m_pWindow, 0);
   m_bFillsDisplay = false;
   if (m_bMaximizedBefore) {

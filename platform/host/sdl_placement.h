@@ -34,6 +34,8 @@ class SdlPlacement {
   Rect CurrentRect() const;
   /// The nearest place on a display that is there now.
   Rect OnDesktop(const Rect& rect) const;
+  /// The same for a window that stands below the window manager's bar.
+  Rect OnDesktopWithBar(Rect inside) const;
   void PutAt(const Rect& rect);
   bool IsFullScreen() const;
   /// In full screen: whether it was before.

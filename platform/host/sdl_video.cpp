@@ -10,8 +10,8 @@ namespace {
 
 bool ShowsNothing(std::string_view driver) { return driver == "offscreen" || driver == "dummy"; }
 
-/// A display of 256 colours has no pixel format that SDL could draw in.
-bool HasTooFewColors() {
+/// Displays of 256 colours, and of 30 bits a pixel, have no pixel format that SDL could draw in.
+bool HasUnknownPixels() {
   SDL_DisplayMode mode;
   return SDL_GetDesktopDisplayMode(0, &mode) == 0 && mode.format == SDL_PIXELFORMAT_UNKNOWN;
 }
@@ -19,7 +19,7 @@ bool HasTooFewColors() {
 /// What is the matter with the display that the person has, where they have one.
 std::string WhyNoDisplay() {
   const char* display = std::getenv("DISPLAY");
-  if (display == nullptr) return "There is no display to show a window on.";
+  if (display == nullptr || *display == '\0') return "There is no display to show a window on.";
   SDL_VideoInit("x11");
   return std::string("The display ") + display + " cannot show a window: " + SDL_GetError() + ".";
 }
@@ -38,8 +38,8 @@ SdlVideo::SdlVideo() {
   } else if (SDL_GetHint(SDL_HINT_VIDEODRIVER) == nullptr &&
              ShowsNothing(SDL_GetCurrentVideoDriver())) {
     m_strTrouble = WhyNoDisplay();
-  } else if (HasTooFewColors()) {
-    m_strTrouble = "The display shows too few colours: a pixel must have 16 bits at least.";
+  } else if (HasUnknownPixels()) {
+    m_strTrouble = "The display cannot be drawn on: a pixel must have 16 or 24 bits of colour.";
   }
   // What nobody takes is not to look as if it were taken.
   SDL_EventState(SDL_DROPFILE, SDL_DISABLE);

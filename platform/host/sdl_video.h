@@ -2,6 +2,8 @@
 
 #include <string>
 
+#include "platform/host/sdl_desktop.h"
+
 namespace platform {
 
 /// SDL with the way to the display that it has found, for as long as this lives.
@@ -18,6 +20,7 @@ class SdlVideo {
   const std::string& Trouble() const { return m_strTrouble; }
 
  private:
+  DesktopPatience m_patience;
   std::string m_strTrouble;
 };
 

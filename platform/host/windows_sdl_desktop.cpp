@@ -8,4 +8,6 @@ bool KnowsFullScreen(SDL_Window*) { return true; }
 
 Rect StillThere(SDL_Window*, const Rect& part) { return part; }
 
+DesktopPatience::DesktopPatience() = default;
+
 }  // namespace platform

@@ -48,7 +48,7 @@ void CScreen::PressAt(Point at) {
 
 void CScreen::MoveTo(Point at) {
   if (m_pPressed != nullptr) return m_pPressed->OnMouseMove(at - m_pPressed->ScreenOrigin());
-  if (!IsTopEnabled()) return;
+  if (m_bDown || !IsTopEnabled()) return;
   CWindow& window = Top()->WindowAt(at - Top()->GetPlace().TopLeft());
   const Point origin = window.ScreenOrigin();
   window.OnMouseHover(at - origin);
@@ -73,6 +73,8 @@ void CScreen::HandleInput(const InputEvent& event) {
   const bool moves =
       event.kind == InputKind::kPointerMove || event.kind == InputKind::kPointerLeave;
   if (!moves) DismissTip();
+  if (event.kind == InputKind::kPointerDown) m_bDown = true;
+  if (event.kind == InputKind::kPointerUp) m_bDown = false;
   switch (event.kind) {
     case InputKind::kPointerDown:
       return PressAt(event.at);

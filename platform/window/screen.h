@@ -64,6 +64,7 @@ class CScreen {
   CBitmap m_composed;  ///< what is shown, while it is more than the frame
   bool m_bStale = true;
   CWindow* m_pPressed = nullptr;  ///< has the pointer until it is released
+  bool m_bDown = false;           ///< the pointer, which hovers over nothing then
 };
 
 }  // namespace platform

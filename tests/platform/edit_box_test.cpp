@@ -65,6 +65,8 @@ TEST_F(NameEdit, ShowsACompositionWhereItWillStand) {
   Put(InputKind::kText, "Annae");
   PutKeys({"Left", "Left", "Shift+Right"});
   const platform::Rect before = CaretPlace();
+  Put(InputKind::kComposition, "");
+  EXPECT_EQ(Edit().GetText(), "Annae");
   Put(InputKind::kComposition, "Mari");
   // It takes the place of what was marked; the name has not got it yet.
   EXPECT_EQ(Edit().GetText(), "Anne");

@@ -13,7 +13,6 @@
 namespace feltside::tests {
 namespace {
 
-namespace fs = std::filesystem;
 using testing::ElementsAre;
 
 TEST_F(ProfileTest, BringsIntegersBack) {

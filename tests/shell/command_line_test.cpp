@@ -24,6 +24,7 @@ TEST(CommandLine, IsAnsweredOrRefused) {
                                    {{"--help"}, 0, "--version", ""},
                                    {{"--fast"}, 2, "", "--fast"},
                                    {{"a.txt", "--help"}, 2, "", "a.txt"},
+                                   {{"--version", "--fast"}, 2, "", "--fast"},
                                    {{""}, 2, "", "--help"}};
   for (const Case& c : cases) {
     SCOPED_TRACE(testing::PrintToString(c.words));
