@@ -9,6 +9,7 @@
 set -u
 cd "$(dirname "$(readlink -f "$0")")/.." || exit 1
 . tools/common.sh
+. bench/display.sh
 
 runs=${1:-5}
 folder=$(readlink -f "${2:-build/play}")
@@ -17,33 +18,7 @@ settle_seconds=3
 patience=30 # seconds until there must be a window
 programs=("$folder/bench/bare-sdl 3" "$folder/feltside" '/usr/games/sgt-solo' '/usr/games/sol'
   '/usr/games/kpat' '/usr/games/ace-solitaire')
-work=$(mktemp -d)
-display_pid=
-program_pid=
 
-end_program() {
-  [ -z "$program_pid" ] || { kill "$program_pid" && wait "$program_pid"; } 2>/dev/null
-  program_pid=
-}
-# shellcheck disable=SC2317  # the trap calls it
-clean_up() {
-  end_program
-  [ -z "$display_pid" ] || { kill "$display_pid" && wait "$display_pid"; } 2>/dev/null
-  rm -rf "$work"
-}
-
-start_display() {
-  Xvfb -displayfd 5 -screen 0 1280x1024x24 -nolisten tcp 5>"$work/display" 2>"$work/xvfb.log" &
-  display_pid=$!
-  until [ -s "$work/display" ]; do
-    kill -0 "$display_pid" 2>/dev/null || fail "Xvfb does not start: $(cat "$work/xvfb.log")"
-    sleep 0.1
-  done
-  DISPLAY=:$(cat "$work/display")
-  export DISPLAY
-}
-
-status() { awk -v name="$1:" '$1 == name { print $2 }' "/proc/$program_pid/status"; }
 # Of all threads.
 switches() {
   awk '/ctxt_switches/ { sum += $2 } END { print sum }' "/proc/$program_pid"/task/*/status
@@ -82,7 +57,6 @@ done
 if [ -z "${DBUS_SESSION_BUS_ADDRESS:-}" ] && command -v dbus-run-session >/dev/null; then
   exec dbus-run-session -- bench/neighbours.sh "$@" 2>/dev/null
 fi
-trap clean_up EXIT
 start_display
 export XDG_CONFIG_HOME=$work/settings HOME=$work
 printf '%-16s %10s %10s %10s %10s\n' program ms kB threads wake-ups

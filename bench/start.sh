@@ -10,10 +10,10 @@
 set -u
 cd "$(dirname "$(readlink -f "$0")")/.." || exit 1
 . tools/common.sh
+. bench/display.sh
 
 runs=${1:-11}
 folder=$(readlink -f "${2:-build/play}")
-display_size=1280x1024x24
 multiple=3 # of the picture's pixels: what the game chooses on a display of this size
 most_start_percent=130
 most_kilobytes=$((15 * 1024))
@@ -21,32 +21,7 @@ deals=20
 idle_seconds=10
 
 game=$folder/feltside
-work=$(mktemp -d)
-display_pid=
-program_pid=
 held=0
-
-end_program() {
-  [ -z "$program_pid" ] || { kill "$program_pid" && wait "$program_pid"; } 2>/dev/null
-  program_pid=
-}
-# shellcheck disable=SC2317  # the trap calls it
-clean_up() {
-  end_program
-  [ -z "$display_pid" ] || { kill "$display_pid" && wait "$display_pid"; } 2>/dev/null
-  rm -rf "$work"
-}
-
-start_display() {
-  Xvfb -displayfd 5 -screen 0 $display_size -nolisten tcp 5>"$work/display" 2>"$work/xvfb.log" &
-  display_pid=$!
-  until [ -s "$work/display" ]; do
-    kill -0 "$display_pid" 2>/dev/null || fail "Xvfb does not start: $(cat "$work/xvfb.log")"
-    sleep 0.1
-  done
-  DISPLAY=:$(cat "$work/display")
-  export DISPLAY
-}
 
 # launch PROGRAM...: starts it and gives it the time to fall asleep.
 launch() {
@@ -54,7 +29,6 @@ launch() {
   program_pid=$!
   sleep 0.7
 }
-status() { awk -v name="$1:" '$1 == name { print $2 }' "/proc/$program_pid/status"; }
 processor_ticks() { awk '{ print $14 + $15 }' "/proc/$program_pid/stat"; }
 switches() { echo $(($(status voluntary_ctxt_switches) + $(status nonvoluntary_ctxt_switches))); }
 
@@ -138,7 +112,6 @@ for needed in Xvfb xdotool; do
 done
 cmake --build "$folder" --target feltside bare-sdl first-frame >"$work/build.log" 2>&1 ||
   fail "the build failed: $(cat "$work/build.log")"
-trap clean_up EXIT
 start_display
 export XDG_CONFIG_HOME=$work/settings
 mkdir -p "$XDG_CONFIG_HOME/Quillworks"
