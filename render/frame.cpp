@@ -1,5 +1,5 @@
-// How a frame is put together: the title until the first deal, then the table, composed off screen
-// and shown in one transfer.
+// How a frame is put together: the title until the first deal, then the table, in the window's own
+// pixels, which nobody sees before they are whole.
 
 #include "platform/window/application.h"
 #include "table/feltside_view.h"
@@ -41,9 +41,8 @@ void CFeltsideView::DrawTitle(CSurface& surface) {
 void CFeltsideView::DrawTable(CSurface& surface) {
   LoadTableBitmap();
   const Rect client = GetClientRect();
-  const platform::Size size{client.Width(), client.Height()};
-  platform::CBitmap pixels(size, m_layout.m_crTable);
-  CSurface frame(pixels);
+  CSurface frame(surface, client);
+  frame.FillRect(frame.Bounds(), m_layout.m_crTable);
   if (m_bFancyBlackjack != 0) frame.BitBlt({}, kTablePicture, *m_pTableBitmap);
   m_layout.Prepare(frame, client);
   if (m_nGameType == kGameBlackjack) {
@@ -52,7 +51,6 @@ void CFeltsideView::DrawTable(CSurface& surface) {
     DrawVideoPokerTable(frame);
   }
   m_layout.Release();
-  surface.BitBlt(client.TopLeft(), size, pixels);
 }
 
 void CFeltsideView::LoadTitleBitmap() {

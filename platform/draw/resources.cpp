@@ -8,6 +8,9 @@
 namespace platform {
 namespace {
 
+/// Enough for every frame of both games.
+constexpr std::size_t kMostKept = 24;
+
 std::string FilePrefix(const std::string& kind, int resourceID) {
   char number[16];
   std::snprintf(number, sizeof number, "%03d_", resourceID);
@@ -46,6 +49,7 @@ const CBitmap& CResources::Load(const std::string& kind, int resourceID, Size bl
   const std::string prefix = FilePrefix(kind, resourceID);
   const auto loaded = m_mapLoaded.find(prefix);
   if (loaded != m_mapLoaded.end()) return loaded->second;
+  if (m_mapLoaded.size() == kMostKept) m_mapLoaded.clear();
   return m_mapLoaded.emplace(prefix, Read(prefix, resourceID, blank)).first->second;
 }
 

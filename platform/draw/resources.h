@@ -10,13 +10,14 @@
 namespace platform {
 
 /// The pictures built into the program, by number: files named "NNN_subject.png" are bitmaps, files
-/// named "icon_NNN_subject.png" icons. Each is decoded once, when it is first asked for.
+/// named "icon_NNN_subject.png" icons. Each is decoded when it is asked for, and the last ones are
+/// kept: a frame shows few of a deck's cards.
 class CResources {
  public:
   explicit CResources(EmbeddedFiles files) : m_files(files) {}
 
-  /// The bitmap of that number, which lives as long as this. Where there is none, or it cannot be
-  /// decoded: a framed blank of the given size that bears the number, the same from then on.
+  /// The bitmap of that number, which lives until the next one is loaded. Where there is none, or
+  /// it cannot be decoded: a framed blank of the given size that bears the number.
   const CBitmap& LoadBitmap(int resourceID, Size blank);
   /// The same for who keeps it: decoded for this call alone.
   CBitmap ReadBitmap(int resourceID, Size blank) const;

@@ -26,8 +26,9 @@ class CFileLock {
   std::error_code m_error;
 };
 
-/// Writes a new file beside the old one, with the old one's permissions, flushes it to the disk and renames it over the old one. Answers what went wrong, if
-/// anything did; then, as with a file that may not be written, the old file is as it was.
+/// Writes a new file beside the old one, with the old one's permissions, flushes it to the disk and
+/// renames it over the old one. Answers what went wrong, if anything did; then, as with a file that
+/// may not be written, the old file is as it was.
 std::error_code WriteWhole(const std::filesystem::path& file, const std::string& text);
 
 }  // namespace platform
