@@ -20,7 +20,7 @@ trap clean_up EXIT
 
 # start_display: returns once there is one, in DISPLAY.
 start_display() {
-  Xvfb -displayfd 5 -screen 0 1280x1024x24 -nolisten tcp 5>"$work/display" 2>"$work/xvfb.log" &
+  Xvfb -noreset -displayfd 5 -screen 0 1280x1024x24 -nolisten tcp 5>"$work/display" 2>"$work/xvfb.log" &
   display_pid=$!
   until [ -s "$work/display" ]; do
     kill -0 "$display_pid" 2>/dev/null || fail "Xvfb does not start: $(cat "$work/xvfb.log")"
