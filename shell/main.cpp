@@ -13,8 +13,7 @@ constexpr int kExitNoDisplay = 3;
 int main(int argc, char** argv) {
   if (const auto exitCode = feltside::AnswerCommandLine(argc, argv)) return *exitCode;
   std::string why;
-  const auto host = platform::CreateHost(
-      {feltside::kWindowSize, {"../share/feltside/help", FELTSIDE_HELP_FOLDER}}, why);
+  const auto host = platform::CreateHost({feltside::kWindowSize, {FELTSIDE_HELP_FOLDERS}}, why);
   if (host == nullptr) {
     std::fprintf(stderr, "Feltside: %s\n", why.c_str());
     return kExitNoDisplay;

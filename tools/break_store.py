@@ -7,7 +7,8 @@ Plays one session of feltside-stylus, which changes all settings and enters a sc
 again: each system call by which files are kept fails in turn, and each allocation; games are
 killed at random moments, two at a time on one file; the file system is full, read-only and slow.
 Prints what came of it. "Lost" is what stood in the file before and is not whole there after;
-"silent" is what was not stored without a word to the player. Ends with 1 where there was any.
+"silent" is what was not stored without a word to the player, "crashed" a game that did not end by
+itself. Ends with 1 where there was any of them.
 With --short, some of all.
 Before it: cmake --build BUILD_FOLDER --target feltside-stylus failing-calls
 """
@@ -38,10 +39,11 @@ LINES = [*OK, "command deal", "command stand", "key N",
          "command table-setup", "select 1005 6", "press 1013", *OK,
          "wallet 250", "command exit", "type Zoe", *OK, "command exit", *OK]
 ERRORS = [errno.EIO, errno.ENOSPC, errno.EINTR, errno.EACCES]
+FAULTS = ("lost", "silent", "crashed")
 PRELOADING = {"ASAN_OPTIONS": "verify_asan_link_order=0:alloc_dealloc_mismatch=0"}
 MOUNTED = """
 mount -t tmpfs -o size=16k none "$1" && mkdir "$1/Quillworks" && cp "$2" "$1/Quillworks" &&
-{ %s; } && { "$3"; code=$?; cp "$1/Quillworks/Feltside.toml" "$2"; exit $code; }"""
+{ %s; } && { "$3"; code=$?; rm "$2"; cp "$1/Quillworks/Feltside.toml" "$2"; exit $code; }"""
 FULL = 'cat /dev/zero >"$1/filler" 2>/dev/null || true'
 READ_ONLY = 'mount -o remount,ro "$1"'
 
@@ -99,7 +101,7 @@ class Breaker:
 
     def note(self, what, outcome, how=""):
         self.outcomes.setdefault(what, Counter())[outcome] += 1
-        if outcome in ("lost", "silent"):
+        if outcome in FAULTS:
             print(f"{what}: {outcome} {how}", flush=True)
 
     def judge(self, what, store, done, how):
@@ -109,8 +111,10 @@ class Breaker:
             outcome = "lost"
         elif is_complete(settings):
             outcome = "stored"
-        elif done.returncode != 0:
+        elif done.returncode > 0 or "std::bad_alloc" in done.stderr:
             outcome = "ended"
+        elif done.returncode < 0:
+            outcome = "crashed"
         else:
             outcome = "told" if was_told(done.stdout) else "silent"
         self.note(what, outcome, how)
@@ -130,28 +134,31 @@ class Breaker:
 
     def fail_calls(self, every):
         calls, allocations = self.counts()
+        tries = [("a system call fails", {"FAIL_CALL": str(number), "FAIL_ERROR": str(error)})
+                 for number in range(1, calls + 1, every)
+                 for error in (ERRORS if every == 1 else [ERRORS[number % len(ERRORS)]])]
+        tries += [("an allocation fails", {"FAIL_MEMORY": str(number)})
+                  for number in range(1, allocations + 1, every * every * every)]
         with ThreadPoolExecutor(os.cpu_count()) as pool:
-            for number in range(1, calls + 1, every):
-                for error in ERRORS if every == 1 else [ERRORS[number % len(ERRORS)]]:
-                    pool.submit(self.play, "a system call fails",
-                                {"FAIL_CALL": str(number), "FAIL_ERROR": str(error)})
-            for number in range(1, allocations + 1, every * every * every):
-                pool.submit(self.play, "an allocation fails", {"FAIL_MEMORY": str(number)})
+            for _ in pool.map(lambda one: self.play(*one), tries):
+                pass  # what a try raised is raised here
 
     def slow(self, microseconds):
         self.play("a slow file system", {"CALL_DELAY": str(microseconds)})
 
     def mounted(self, what, preparation):
         """On a file system of its own, which takes a kernel that lets users have one."""
+        trial = subprocess.run(["unshare", "-rm", "mount", "-t", "tmpfs", "none", "/mnt"],
+                               capture_output=True, text=True, check=False)
+        if trial.returncode:
+            print(f"{what}: cannot be tried here: {trial.stderr.strip()}")
+            return
         with Store() as store, tempfile.TemporaryDirectory() as place:
             script = MOUNTED % preparation
             done = subprocess.run(["unshare", "-rm", "sh", "-c", script, "sh", place, store.file,
                                    self.game], input="\n".join(LINES), capture_output=True,
                                   text=True, env=self.environment(place, {}), check=False)
-            if done.stdout:
-                self.judge(what, store, done, done.stderr)
-            else:
-                print(f"{what}: cannot be tried here: {done.stderr.strip()}")
+            self.judge(what, store, done, done.stderr)
 
     def start(self, store, steps):
         """A game that changes one setting after another, at its first answer."""
@@ -192,12 +199,12 @@ class Breaker:
                   f"{name} = {settings and settings.get(name)} after {steps} steps")
 
     def report(self):
-        columns = ("stored", "told", "ended", "lost", "silent")
+        columns = ("stored", "told", "ended", *FAULTS)
         print(f"{'':24}{'tried':>8}" + "".join(f"{column:>8}" for column in columns))
         for what, outcomes in self.outcomes.items():
             print(f"{what:24}{outcomes.total():8}" +
                   "".join(f"{outcomes[column]:8}" for column in columns))
-        return any(outcomes["lost"] + outcomes["silent"] for outcomes in self.outcomes.values())
+        return any(outcomes[fault] for outcomes in self.outcomes.values() for fault in FAULTS)
 
 
 def main():

@@ -41,7 +41,7 @@ OURS = [
 
 SDL = r"SDL.*"
 SYSTEM = r"(sys/\w+|fcntl|unistd|pwd|signal|poll|errno|dirent)\.h"
-WINDOWS = r"(windows|shellapi|fcntl|io|process|share|sys/stat|unistd)\.h"
+WINDOWS = r"(windows|shellapi|shlobj|fcntl|io|process|share|sys/stat|unistd)\.h"
 GTEST = r"g(test|mock)/g(test|mock).*\.h"
 JSON = r"nlohmann/.*"
 

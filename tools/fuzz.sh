@@ -30,7 +30,7 @@ for target in "${targets[@]}"; do
   mkdir -p "$folder/corpus/$target"
   log=$folder/$target.log
   "$program" -fork="$(nproc)" -max_total_time="$seconds" -max_len=2000 -rss_limit_mb=4096 \
-    -artifact_prefix="$folder/found/$target-" \
+    -timeout=60 -ignore_ooms=0 -ignore_timeouts=0 -artifact_prefix="$folder/found/$target-" \
     "$folder/corpus/$target" "fuzz/corpus/$target" >"$log" 2>&1 || faults=1
   say "$target: $(grep -a -o '^#[0-9]*' "$log" | tail -1) inputs in ${seconds} s; log: $log"
 done

@@ -32,9 +32,12 @@ with_sources() {
 
 # download PACKAGE: the newest sources that can be had. A mirror may not have all that its list names.
 download() {
-  local version
+  local version newest=
   while read -r version; do
-    with_sources apt-get source "$1=$version" && return
+    : "${newest:=$version}"
+    with_sources apt-get source "$1=$version" >>"$log" 2>&1 || continue
+    [ "$version" = "$newest" ] || say "$1 $newest cannot be had, taking $version"
+    return
   done < <(with_sources apt-cache showsrc "$1" | sed -n 's/^Version: //p' | sort -Vru)
   return 1
 }
@@ -44,7 +47,7 @@ fetch() {
   local name=$1 package=$2 version=$3 work=$folder/fetch-$1 found
   rm -rf "$work"
   mkdir -p "$work" || return
-  (cd "$work" && download "$package") >>"$log" 2>&1 || return
+  (cd "$work" && download "$package") || return
   found=$(find "$work" -mindepth 1 -maxdepth 1 -type d)
   [[ ${found##*/} == "$package-$version"* ]] || {
     say "Debian has ${found##*/}, and editions/libraries was written for $version"

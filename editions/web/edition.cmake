@@ -2,7 +2,7 @@
 set(FELTSIDE_SIBLINGS web)
 set(FELTSIDE_LIBRARIES FREETYPE)
 # The page opens its help itself.
-set(FELTSIDE_HELP_FOLDER "")
+set(FELTSIDE_HELP_FOLDERS "")
 set(PYTHON /usr/bin/python3)
 
 # The letters that people write names with: Latin, Greek, Cyrillic. All other texts are the game's own,

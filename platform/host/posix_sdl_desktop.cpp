@@ -86,6 +86,9 @@ bool KnowsFullScreen(SDL_Window* window) {
          library.DesktopSupports("_NET_WM_STATE_FULLSCREEN");
 }
 
+// A window manager tells it by what it makes of the place that it is asked for.
+int BarAbove(SDL_Window*) { return 0; }
+
 Rect StillThere(SDL_Window* window, const Rect& part) {
   const auto info = OnX(window);
   if (!info) return part;
@@ -94,6 +97,9 @@ Rect StillThere(SDL_Window* window, const Rect& part) {
   const XWindowAttributes root = library.Root();
   return part.Intersection(RectAt({}, {root.width, root.height}));
 }
+
+// Who starts a program here is told by its streams.
+void ShowTrouble(const std::string&) {}
 
 DesktopPatience::DesktopPatience() {
   m_library.emplace(kXLibrary);

@@ -17,7 +17,7 @@ fs::path ProgramPath(const fs::path& path) {
   char* base = SDL_GetBasePath();
   const fs::path program = FromUtf8(base == nullptr ? "." : base);
   SDL_free(base);
-  return (program / path).lexically_normal();
+  return program / path;
 }
 
 /// The first of the folders that is there; empty where none is.
@@ -25,7 +25,9 @@ fs::path HelpFolder(const std::vector<fs::path>& folders) {
   std::error_code error;
   for (const fs::path& folder : folders) {
     const fs::path place = ProgramPath(folder);
-    if (fs::is_directory(place, error)) return fs::canonical(place, error);
+    if (!fs::is_directory(place, error)) continue;
+    const fs::path real = fs::canonical(place, error);
+    return error ? place : real;  // on another machine there is no telling
   }
   return {};
 }
@@ -54,7 +56,8 @@ std::string StartHelpViewer(const std::vector<fs::path>& folders, const std::str
   const fs::path page = HelpPage(folders, commandLine);
   std::string trouble;
   if (page.empty()) {
-    trouble = "The help pages are not in " + ToUtf8(ProgramPath(folders.front())) + ".";
+    trouble = "The help pages are not in " +
+              ToUtf8(ProgramPath(folders.front()).lexically_normal()) + ".";
   } else if (!OpenInBrowser(page, milliseconds)) {
     trouble = "The help cannot be shown in a browser; it lies in " + ToUtf8(page) + ".";
   }

@@ -1,15 +1,12 @@
 #include <SDL.h>
 
-#include "platform/host/create_host.h"
-#ifdef __GLIBC__
-#include <malloc.h>
-#endif
-
 #include <ctime>
 #include <utility>
 
+#include "platform/host/create_host.h"
 #include "platform/host/help_viewer.h"
 #include "platform/host/profile_folder.h"
+#include "platform/host/sdl_desktop.h"
 #include "platform/host/sdl_events.h"
 #include "platform/host/sdl_fonts.h"
 #include "platform/host/sdl_video.h"
@@ -96,30 +93,18 @@ class SdlHost : public Host {
   std::vector<std::filesystem::path> m_arrHelpFolders;
 };
 
-/// A frame is composed in a block of its own at every paint. The memory of such blocks goes back to
-/// the system at once, rather than staying with the process between paints.
-void ReturnLargeBlocks() {
-#ifdef __GLIBC__
-  constexpr int kLargeBlock = 128 * 1024;
-  mallopt(M_MMAP_THRESHOLD, kLargeBlock);
-#endif
-}
-
 }  // namespace
 
 std::unique_ptr<Host> CreateHost(const HostOptions& options, std::string& why) {
-  ReturnLargeBlocks();
   auto video = std::make_unique<SdlVideo>();
-  if (!video->Trouble().empty()) {
-    why = video->Trouble();
-    return nullptr;
-  }
-  auto host = std::make_unique<SdlHost>(std::move(video), options);
-  if (!host->IsReady()) {
+  why = video->Trouble();
+  if (why.empty()) {
+    auto host = std::make_unique<SdlHost>(std::move(video), options);
+    if (host->IsReady()) return host;
     why = std::string("The window cannot be opened: ") + SDL_GetError();
-    return nullptr;
   }
-  return host;
+  ShowTrouble(why);
+  return nullptr;
 }
 
 }  // namespace platform

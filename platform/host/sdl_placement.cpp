@@ -126,6 +126,7 @@ bool SdlPlacement::IsMaximized() const {
 }
 
 int SdlPlacement::BarHeight() const {
+  if (const int bar = BarAbove(m_pWindow); bar > 0) return bar;
   const int height = m_rcOpened.top - m_rcAsked.top;
   return height > 0 && height <= 2 * kTitleBar ? height : 0;
 }

@@ -7,7 +7,7 @@
 // hands over are the program's to free.
 extern "C" {
 
-/// What happens on the page, in the order of `kinds` in the page's input.js.
+/// What happens on the page, in the order of `kinds` in the page's events.js.
 enum PageEventKind : int {
   kPageRoom,  ///< the room has become x by y pixels
   kPageDown,

@@ -35,8 +35,9 @@ struct Contents {
 
 std::string Reason(const std::error_code& error) {
   if (!error) return {};
-  const bool held = error == std::errc::operation_would_block;
-  return held ? "another running game holds it" : error.message();
+  if (error == std::errc::operation_would_block) return "another running game holds it";
+  if (error == std::errc::device_or_resource_busy) return "another program has it open";
+  return error.message();
 }
 
 Contents Refused(const std::error_code& error) { return {Reason(error), "", CProfileSections()}; }
@@ -59,7 +60,11 @@ Contents ReadContents(const fs::path& file) {
   const fs::file_status status = fs::status(file, error);
   if (fs::is_other(status)) return Refused(make_error_code(std::errc::not_supported));
   Contents contents;
-  error = ReadText(file, contents.text);
+  std::chrono::milliseconds left = kPatienceWithPrograms;
+  do {
+    contents.text.clear();
+    error = ReadText(file, contents.text);
+  } while (MayPass(error, left));
   const bool missing =
       error == std::errc::no_such_file_or_directory || error == std::errc::not_a_directory;
   if (error && !missing) return Refused(error);
@@ -69,9 +74,9 @@ Contents ReadContents(const fs::path& file) {
 
 fs::path LockOf(const fs::path& file) { return fs::path(file) += ".lock"; }
 
-/// A free name beside the file: "name.damaged-1" and so on.
-fs::path NameForDamaged(const fs::path& file) {
-  std::error_code error;
+/// A free name beside the file: "name.damaged-1" and so on; of no use where it cannot be told
+/// whether it is free.
+fs::path NameForDamaged(const fs::path& file, std::error_code& error) {
   fs::path name;
   int number = 1;
   do {
@@ -80,7 +85,8 @@ fs::path NameForDamaged(const fs::path& file) {
   return name;
 }
 
-/// What a symbolic link leads to is replaced, not the link.
+/// What a symbolic link leads to is replaced, not the link. The standard library knows of none on
+/// Windows.
 fs::path TargetOf(fs::path file) {
   std::error_code error;
   for (int links = 0; links < kMostLinks && fs::is_symlink(file, error); ++links) {
@@ -170,9 +176,9 @@ Contents CFileProfile::ReadLocked(const CFileLock& lock) {
 }
 
 std::string CFileProfile::SetAside() {
-  const fs::path kept = NameForDamaged(m_file);
   std::error_code error;
-  fs::rename(m_file, kept, error);
+  const fs::path kept = NameForDamaged(m_file, error);
+  if (!error) fs::rename(m_file, kept, error);
   if (error) {
     return "it cannot be understood, and not be kept under another name (" + Reason(error) + ")";
   }
@@ -184,8 +190,9 @@ std::string CFileProfile::SetAside() {
 /// Keeps the file as it was, in which something stands under this name that is not what must be
 /// written in its place.
 std::string CFileProfile::KeepCopy(const std::string& text, const std::string& name) {
-  const fs::path kept = NameForDamaged(m_file);
-  const std::error_code error = WriteWhole(kept, text);
+  std::error_code error;
+  const fs::path kept = NameForDamaged(m_file, error);
+  if (!error) error = WriteWhole(kept, text);
   if (error) return "what it holds as " + name + " cannot be kept (" + Reason(error) + ")";
   Tell(Named() + " held something else as " + name + ". The file as it was is kept as " +
        ToUtf8(kept) + ".");
@@ -203,6 +210,7 @@ std::string CFileProfile::Store(const std::string& section, const Change& change
   change(values);
   const auto changed = ChangeSection(stored.text, section, values);
   if (!changed) return "what else it holds cannot be written again";
+  if (changed->text.size() > kLargestFile) return "it holds too much";
   std::string refusal = changed->foreign.empty() ? "" : KeepCopy(stored.text, changed->foreign);
   if (refusal.empty()) refusal = Reason(WriteWhole(m_file, changed->text));
   if (!refusal.empty()) ListLost(values);

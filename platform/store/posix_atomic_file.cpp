@@ -55,20 +55,29 @@ std::error_code WriteFresh(const fs::path& fresh, const std::string& text, mode_
   return error;
 }
 
+/// Whether a lock failed as the file system knows of none.
+bool HasNoLocks(const std::error_code& error) {
+  return error == std::errc::no_lock_available || error == std::errc::function_not_supported ||
+         error == std::errc::operation_not_supported || error == std::errc::invalid_argument;
+}
+
 std::error_code Lock(int descriptor, std::chrono::milliseconds patience) {
   constexpr useconds_t kBetween = 1000;  // microseconds; short, as others come between
   const auto end = steady_clock::now() + patience;
   while (flock(descriptor, LOCK_EX | LOCK_NB) != 0) {
     const std::error_code error = LastError();
     const bool held = error == std::errc::operation_would_block;
-    if (!held && error != std::errc::interrupted) return {};  // a file system without locks
-    if (held && steady_clock::now() >= end) return error;
+    if (HasNoLocks(error)) return {};
+    if (!held && error != std::errc::interrupted) return error;
+    if (steady_clock::now() >= end) return error;
     usleep(kBetween);
   }
   return {};
 }
 
 }  // namespace
+
+bool MayPass(const std::error_code&, std::chrono::milliseconds&) { return false; }
 
 CFileLock::CFileLock(const fs::path& lockFile, std::chrono::milliseconds patience)
     : m_nDescriptor(open(lockFile.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)),

@@ -1,6 +1,6 @@
 // The profile in what a browser keeps for a page: an item for every value, a number as its digits,
-// a string behind a quotation mark. The browser lets no other page come between reading and
-// writing.
+// a string behind a quotation mark. A browser that gives pages processes of their own does not keep
+// them from writing at the same instant; only values that both change can then be the other's.
 
 #include <algorithm>
 #include <charconv>
@@ -19,8 +19,7 @@ using Value = CProfileSection::Value;
 constexpr char kStringMark = '"';
 constexpr char kKeepsNothing[] =
     "This browser keeps nothing for this page: the defaults hold, and what is set or won is lost "
-    "when "
-    "the game ends.";
+    "when the game ends.";
 constexpr char kFull[] = "This browser has no room left to keep what was set or won.";
 
 std::string ToItem(const Value& value) {

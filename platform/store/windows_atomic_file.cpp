@@ -5,6 +5,7 @@
 #include <unistd.h>
 #include <windows.h>
 
+#include <algorithm>
 #include <cerrno>
 
 #include "platform/store/atomic_file.h"
@@ -15,17 +16,17 @@ namespace {
 namespace fs = std::filesystem;
 using std::chrono::milliseconds;
 
-/// Between two tries. The system may make it 16.
-constexpr milliseconds kBetween{10};
-/// Games read the file without a lock, and a scanner looks at what is new.
-constexpr milliseconds kPatienceWithReaders{1000};
+constexpr milliseconds kBetween{10};  ///< two tries
 
 std::error_code LastError() { return {errno, std::generic_category()}; }
 
 /// The same as the C library would call it, whose words are those of every other machine.
 std::error_code Translated(DWORD error) {
   const std::error_code raw(static_cast<int>(error), std::system_category());
-  return {raw.default_error_condition().value(), std::generic_category()};
+  const std::error_condition known = raw.default_error_condition();
+  return make_error_code(known.category() == std::generic_category()
+                             ? static_cast<std::errc>(known.value())
+                             : std::errc::io_error);
 }
 
 std::error_code WriteAll(int descriptor, const std::string& text) {
@@ -52,20 +53,23 @@ std::error_code WriteFresh(const fs::path& fresh, const std::string& text) {
 /// Sleeps for a part of the time that is left; false: none is left.
 bool Wait(milliseconds& left) {
   if (left <= milliseconds::zero()) return false;
+  const ULONGLONG start = GetTickCount64();
   usleep(static_cast<useconds_t>(std::chrono::microseconds(kBetween).count()));
-  left -= kBetween;
+  // The system may make it longer.
+  left -= std::max(kBetween, milliseconds(GetTickCount64() - start));
   return true;
 }
 
 /// Puts a file in the place of another in one step, which the disk has done when this returns. That
 /// cannot be while somebody has the other one open.
 std::error_code Rename(const fs::path& from, const fs::path& to) {
-  milliseconds left = kPatienceWithReaders;
+  milliseconds left = kPatienceWithPrograms;
   while (
       !MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH)) {
     const DWORD error = GetLastError();
     const bool open = error == ERROR_SHARING_VIOLATION || error == ERROR_ACCESS_DENIED;
-    if (!open || !Wait(left)) return Translated(error);
+    if (!open) return Translated(error);
+    if (!Wait(left)) return make_error_code(std::errc::device_or_resource_busy);
   }
   return {};
 }
@@ -83,6 +87,10 @@ std::error_code Lock(int descriptor, milliseconds left) {
 }
 
 }  // namespace
+
+bool MayPass(const std::error_code& error, milliseconds& left) {
+  return error == std::errc::permission_denied && Wait(left);
+}
 
 CFileLock::CFileLock(const fs::path& lockFile, milliseconds patience)
     : m_nDescriptor(_wsopen(lockFile.c_str(), _O_RDWR | _O_CREAT | _O_BINARY | _O_NOINHERIT,

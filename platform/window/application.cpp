@@ -84,7 +84,10 @@ void CApplication::OnIdle() {
 
 void CApplication::TakeTroubles() {
   if (m_pProfile == nullptr) return;
-  for (const std::string& trouble : m_pProfile->TakeTroubles()) Notify(trouble);
+  // The same one comes again only where something could be stored in between.
+  for (std::string& trouble : m_pProfile->TakeTroubles()) {
+    m_arrNotices.push_back(std::move(trouble));
+  }
 }
 
 void CApplication::ShowNextNotice() {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <functional>
+
 namespace feltside::tests {
 
 // A machine that fails on demand, for the whole program in which this is linked.
@@ -11,5 +13,6 @@ inline int g_nBeforeRefusal = -1;       ///< so many that do not throw still suc
 inline bool g_bRefusesOnce = false;     ///< only the one after those fails
 inline bool g_bSleepsInNoTime = false;  ///< usleep only moves the clock
 inline long g_nMicrosecondsSlept = 0;   ///< in that way
+inline std::function<void()> g_afterSleep;  ///< happens once, during the next such sleep
 
 }  // namespace feltside::tests

@@ -3,6 +3,7 @@
 #include <unistd.h>
 
 #include <ctime>
+#include <utility>
 
 #include "tests/platform/failing_machine.h"
 
@@ -11,6 +12,7 @@ using namespace feltside::tests;
 extern "C" int usleep(useconds_t microseconds) {
   if (g_bSleepsInNoTime) {
     g_nMicrosecondsSlept += static_cast<long>(microseconds);
+    if (g_afterSleep) std::exchange(g_afterSleep, nullptr)();
     return 0;
   }
   const timespec time{0, static_cast<long>(microseconds) * 1000};

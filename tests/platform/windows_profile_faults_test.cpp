@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <fstream>
 
+#include "platform/host/profile_folder.h"
 #include "tests/platform/failing_machine.h"
 #include "tests/platform/profile_helpers.h"
 
@@ -43,11 +44,19 @@ TEST_F(WindowsFaults, LeaveTheFileThatAnotherProgramHolds) {
   for (const DWORD others : {0UL, DWORD{FILE_SHARE_READ}}) {
     const HANDLE held = Hold(m_file, others);
     EXPECT_EQ(GetInt("x"), others == 0 ? 7 : 1);
-    ExpectNothingStored("cannot be written: Permission denied");
+    ExpectNothingStored(others == 0 ? "cannot be written: Permission denied"
+                                    : "cannot be written: another program has it open");
     CloseHandle(held);
     EXPECT_EQ(ReadFile(m_file), "[S]\nx = 1\n");
     EXPECT_TRUE(Store("x", 1));
   }
+}
+
+TEST_F(WindowsFaults, WaitForAProgramThatLetsGoOfTheFile) {
+  const HANDLE held = Hold(m_file, 0);
+  g_afterSleep = [held] { CloseHandle(held); };
+  EXPECT_EQ(GetInt("x"), 1);
+  EXPECT_THAT(m_pProfile->TakeTroubles(), ElementsAre());
 }
 
 TEST_F(WindowsFaults, LeaveTheFileThatMayOnlyBeRead) {
@@ -83,6 +92,21 @@ TEST_F(WindowsFaults, LeaveTheFileOnAFullDrive) {
   EXPECT_THAT(m_pProfile->TakeTroubles(), ElementsAre(HasSubstr("No space left on device")));
   EXPECT_EQ(ReadFile(file), "[S]\nx = 1\n");
   EXPECT_FALSE(exists(fs::path(file) += ".new"));
+}
+
+TEST(WindowsProfileFolder, IsWhatTheEnvironmentNamesOrElseTheSystem) {
+  const auto folderBy = [](const wchar_t* value) {
+    _wputenv((std::wstring(L"APPDATA=") + value).c_str());
+    return platform::DefaultProfileFolder();
+  };
+  const std::wstring before = _wgetenv(L"APPDATA");
+  for (const wchar_t* named : {L"C:\\Users\\Ann\\Roaming", L"\\\\server\\users\\Ann"}) {
+    EXPECT_EQ(folderBy(named), named);
+  }
+  for (const wchar_t* unusable : {L"", L"Roaming"}) {
+    EXPECT_TRUE(folderBy(unusable).is_absolute()) << fs::path(unusable);
+  }
+  folderBy(before.c_str());
 }
 
 /// A person's folder that no code page has all letters of.

@@ -83,7 +83,8 @@ std::string Player::AtTheTable(const Json& state) {
                               "key B", "key +", "key -",   "key 1",     "key 2",     "key 3",
                               "key 4", "key 5", "key F10", "key Enter", "key Space", "key Alt+B"};
   static const Texts kDialogs = {"command game-setup", "command table-setup", "command scores",
-                                 "command about", "command exit"};
+                                 "command about"};
+  static const Texts kEnds = {"command exit", "close"};
   static const Texts kMalformed = {"hit",         "tap",     "tap x y",   "stack 99",
                                    "wallet much", "key Hit", "clock now", "press 1 2"};
   const bool poker = state["m_nGameType"] == 1;
@@ -103,7 +104,7 @@ std::string Player::AtTheTable(const Json& state) {
   if (choice < 97) return "clock 20" + std::to_string(Number(10, 99)) + "-02-28T23:59:58";
   if (choice < 98) return "type H";
   if (choice < 99) return "wallet " + std::to_string(Number(-400, 4000) / 2.0);
-  return Number(0, 40) == 0 ? "close" : "state";
+  return Number(0, 3) == 0 ? OneOf(kEnds) : "state";
 }
 
 std::string Player::AtADialog(const Json& controls) {

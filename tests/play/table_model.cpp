@@ -128,12 +128,12 @@ const char* SelectedShoe(const Json& state) {
   return shoes[state["m_nDeckChoice"].get<std::size_t>()];
 }
 
-/// Only a deal takes cards while no hand is in progress.
+/// Only a deal takes cards while no hand is in progress; one that runs out of them begins a shoe
+/// anew.
 bool TableModel::WasDealt(const std::string& command, const Json& state) const {
   if (command.rfind("stack", 0) == 0 || m_before["m_bHandInProgress"] == 1) return false;
   const Json& shoe = state[SelectedShoe(state)];
-  return state["m_nGameType"] == 0 && shoe["position"] >= 4 &&
-         shoe != m_before[SelectedShoe(state)];
+  return state["m_nGameType"] == 0 && shoe["position"] > 0 && shoe != m_before[SelectedShoe(state)];
 }
 
 double TableModel::BlackjackMoney(const Json& state, bool dealt) const {

@@ -72,6 +72,15 @@ TEST(Notices, TellOfSettingsThatCannotBeReadOrKept) {
   desk.Command(kCommandTableSetup);
   Press(desk, {"Shift+Tab", "Shift+Tab", "Enter"});
   EXPECT_NE(BoxText(desk).find(file), std::string::npos);
+  // Once things are in order again, the same trouble is news.
+  Press(desk, {"Enter"});
+  for (const bool inTheWay : {false, true}) {
+    std::filesystem::remove_all(desk.Host().ProfileFolder() / "Quillworks");
+    if (inTheWay) WriteFile(desk.Host().ProfileFolder() / "Quillworks", "again");
+    desk.Command(kCommandTableSetup);
+    Press(desk, {"Shift+Tab", "Shift+Tab", "Enter"});
+    EXPECT_EQ(BoxText(desk).find(file) != std::string::npos, inTheWay);
+  }
 }
 
 TEST(Notices, TellOfAnEndThatKeepsNothing) {

@@ -10,6 +10,7 @@
 
   /** What a key means: digits whichever layer they lie on, and a letter's place where none is Latin. */
   function nameOf(event) {
+    if (event.key === 'Dead' || event.key === 'Process') return '';  // a part of a letter to come
     if (NAMES[event.key]) return NAMES[event.key];
     const place = /^(Digit|Key)(.)$/.exec(event.code);
     const sign = event.key.length === 1 ? event.key.toUpperCase() : '';
@@ -21,8 +22,10 @@
   /** The chord that the program gets; empty where the key is not for it. */
   function chordOf(event) {
     const name = nameOf(event);
-    const typesByAlt = event.getModifierState('AltGraph');
-    if (!name || event.metaKey || event.isComposing || typesByAlt) return '';
+    const typesByAlt = event.getModifierState('AltGraph') ||
+      (typing.isWanted() && event.altKey && event.key.length === 1 && event.key > '~');
+    const pastes = typing.isWanted() && event.shiftKey && name === 'Insert';
+    if (!name || event.metaKey || event.isComposing || typesByAlt || pastes) return '';
     if (event.ctrlKey && !(typing.isWanted() && EDITING.includes(name))) return '';
     return (event.ctrlKey ? 'Ctrl+' : '') + (event.altKey ? 'Alt+' : '') + (event.shiftKey ? 'Shift+' : '') + name;
   }

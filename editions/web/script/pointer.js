@@ -19,13 +19,16 @@
     if (!event.isPrimary || event.button !== 0) return;
     canvas.setPointerCapture(event.pointerId);
     if (!typing.isWanted()) canvas.focus({ preventScroll: true });
+    typing.forget();
     put('down', event);
   });
   canvas.addEventListener('pointermove', function (event) {
     if (event.isPrimary && (event.buttons & 1 || event.pointerType === 'mouse')) put('move', event);
   });
   canvas.addEventListener('pointerup', function (event) {
-    if (event.isPrimary && event.button === 0) put('up', event);
+    if (!event.isPrimary || event.button !== 0) return;
+    put('up', event);
+    if (event.pointerType === 'touch') typing.callKeyboard(event.clientX, event.clientY);
   });
   // The system has taken the finger for itself: nothing is pushed.
   canvas.addEventListener('pointercancel', function (event) {

@@ -44,7 +44,15 @@ const typing = (function () {
     /** The caret has gone elsewhere, or the text has changed without the field. */
     forget: function () { if (wanted) forget(); },
 
-    /** Text is wanted at these pixels of a picture of that size. */
+    /** A finger has touched the text: a keyboard that was put away comes again. */
+    callKeyboard: function (x, y) {
+      const place = field.getBoundingClientRect();
+      if (!wanted || x < place.left || x > place.right || y < place.top || y > place.bottom) return;
+      field.blur();
+      field.focus({ preventScroll: true });
+    },
+
+    /** Text is wanted at these pixels of the picture. */
     want: function (left, top, width, height) {
       field.style.left = left / 2.4 + '%';
       field.style.top = top / 2.94 + '%';
