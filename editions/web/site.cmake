@@ -22,7 +22,7 @@ if(EXISTS ${ROOT}/.git)
   set(sources --files-from=${SITE}/../sources.txt)
 endif()
 execute_process(
-  COMMAND tar --create --gzip --file ${SITE}/feltside-sources.tar.gz --transform s,^\\(\\./\\)*,feltside/,
+  COMMAND tar --create --gzip --file ${SITE}/feltside-sources.tar.gz --transform "s,^\\(\\./\\)*,feltside/,"
           --exclude=./build --exclude=./.git --exclude=__pycache__ ${sources}
   WORKING_DIRECTORY ${ROOT} COMMAND_ERROR_IS_FATAL ANY)
 
