@@ -89,6 +89,8 @@ int CDialog::DoModal() {
   CTopWindow* below = TheApp().Screen().Top();
   CWindow* focusBelow = below == nullptr ? nullptr : below->GetFocus();
   if (focusBelow != nullptr) focusBelow->OnFocus(false);
+  // The table is not painted while a dialog is open, which needs about as much as its pictures.
+  TheApp().Resources().Forget();
   {
     const DeadBackground dead;
     Open();

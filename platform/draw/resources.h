@@ -16,8 +16,9 @@ class CResources {
  public:
   explicit CResources(EmbeddedFiles files) : m_files(files) {}
 
-  /// The bitmap of that number, which lives until the next one is loaded. Where there is none, or
-  /// it cannot be decoded: a framed blank of the given size that bears the number.
+  /// The bitmap of that number, which lives until the next one is loaded or all are forgotten.
+  /// Where there is none, or it cannot be decoded: a framed blank of the given size that bears the
+  /// number.
   const CBitmap& LoadBitmap(int resourceID, Size blank);
   /// The same for who keeps it: decoded for this call alone.
   CBitmap ReadBitmap(int resourceID, Size blank) const;
@@ -26,6 +27,8 @@ class CResources {
   /// The picture of an icon that comes in several sizes, by its width in pixels; nothing where it
   /// does not come in that size.
   std::optional<CBitmap> LoadIconOfSize(int resourceID, int width) const;
+  /// Keeps none of them any longer: makes room for a while in which they are not painted.
+  void Forget() { m_mapLoaded.clear(); }
 
  private:
   const CBitmap& Load(const std::string& kind, int resourceID, Size blank);
