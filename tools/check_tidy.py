@@ -1,5 +1,8 @@
 #!/usr/bin/env python3
-"""Runs clang-tidy over all that a build folder compiles: tools/check_tidy.py build/check
+"""Runs clang-tidy over all that a build folder compiles, or over the files that begin so:
+
+    tools/check_tidy.py build/check
+    tools/check_tidy.py build/windows windows_
 
 What clang-tidy costs is mostly the libraries' headers, which it reads whole for each file. So the
 files of one library or program are looked at as one text; where they do not go together, as two
@@ -42,6 +45,19 @@ def dependencies(build):
     return found
 
 
+def machine_flags(compiler):
+    """What tells clang-tidy of another machine that the compiler compiles for."""
+    machine = run(compiler, "-dumpmachine").stdout.strip()
+    if machine == run("c++", "-dumpmachine").stdout.strip():
+        return []
+    said = run(compiler, "-E", "-v", "-x", "c++", "/dev/null").stderr
+    folders = said.split("#include <...> search starts here:\n")[1].split("\nEnd of search")[0]
+    # A compiler's own headers are for it alone.
+    return [f"--target={machine}"] + [
+        f"-isystem{folder}" for folder in folders.split()
+        if not re.search(r"/lib/(gcc/[^/]+|clang)/[^/]+/include(-fixed)?$", folder)]
+
+
 def in_root(path):
     return str(path.relative_to(ROOT))
 
@@ -73,17 +89,20 @@ def write_as_one(files, path):
     return starts
 
 
-def read_units(build):
+def read_units(build, beginning):
     """The units of a build, by the names of the libraries and programs that they are built into."""
-    units, objects = {}, dependencies(build)
+    units, objects, machines = {}, dependencies(build), {}
     for entry in json.loads((build / "compile_commands.json").read_text(encoding="utf-8")):
         file = Path(entry["file"]).resolve()
-        if not file.is_relative_to(ROOT) or file.is_relative_to(build):
+        if (not file.is_relative_to(ROOT) or file.is_relative_to(ROOT / "build")
+                or not file.name.startswith(beginning)):
             continue
-        words = shlex.split(entry["command"])
+        compiler, *words = shlex.split(entry["command"])
+        if compiler not in machines:
+            machines[compiler] = machine_flags(compiler)
         output = words[words.index("-o") + 1]
         name = re.search(r"CMakeFiles/(.+?)\.dir/", output)[1]
-        unit = units.setdefault(name, Unit(words[1:words.index("-o")]))
+        unit = units.setdefault(name, Unit(machines[compiler] + words[:words.index("-o")]))
         unit.files.append(in_root(file))
         used = ((build / header).resolve() for header in objects.get(output, []))
         unit.headers.update(in_root(path) for path in used
@@ -135,7 +154,7 @@ def main():
     folder.mkdir(exist_ok=True)
     common = run("clang-tidy", "--version").stdout.encode()
     common += (ROOT / ".clang-tidy").read_bytes() + Path(__file__).read_bytes()
-    units = read_units(build)
+    units = read_units(build, sys.argv[2] if len(sys.argv) > 2 else "")
     marks = {name: unit.fingerprint(common) for name, unit in units.items()}
     kept = folder / "clean.json"
     clean = json.loads(kept.read_text(encoding="utf-8")) if kept.is_file() else {}

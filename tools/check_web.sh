@@ -29,6 +29,7 @@ done
 say "script and program take $bytes bytes on the way to a browser"
 [ $bytes -lt $most_bytes ] || fail "that is more than $most_bytes"
 
+system_python tools/check_tidy.py build/web web_ || fail 'clang-tidy has findings'
 FELTSIDE_STYLUS=$PWD/build/node/feltside-stylus build/check/tests/play-tests --gtest_brief=1 \
   '--gtest_filter=*Scripts*:Seeds/RandomPlay.*/0' || fail 'the game fails in the machine of browsers'
 system_python tests/web/web_test.py

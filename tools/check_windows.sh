@@ -24,6 +24,8 @@ if ! cmake --preset windows -DFELTSIDE_TESTS=ON >"$log" 2>&1 ||
   fail 'the build failed'
 fi
 
+system_python tools/check_tidy.py build/windows windows_ || fail 'clang-tidy has findings'
+
 # A Windows of its own, that asks for nothing and shows nothing.
 export WINEPREFIX=$folder/wine WINEDEBUG=-all WINEDLLOVERRIDES=mscoree,mshtml= LC_ALL=C.UTF-8
 unset DISPLAY

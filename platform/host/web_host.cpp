@@ -60,7 +60,7 @@ class WebHost : public Host {
 };
 
 bool WebHost::NextEvent(InputEvent& event) {
-  PageEvent raw;
+  PageEvent raw{};
   while (page_next_event(&raw) != 0) {
     event = {};
     event.at = m_fit.FramePoint({raw.x, raw.y});

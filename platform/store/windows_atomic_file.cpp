@@ -75,6 +75,7 @@ std::error_code Rename(const fs::path& from, const fs::path& to) {
 }
 
 std::error_code Lock(int descriptor, milliseconds left) {
+  // NOLINTNEXTLINE(performance-no-int-to-ptr): the run-time library tells a handle as a number
   auto* const file = reinterpret_cast<HANDLE>(_get_osfhandle(descriptor));
   OVERLAPPED start{};
   while (!LockFileEx(file, LOCKFILE_EXCLUSIVE_LOCK | LOCKFILE_FAIL_IMMEDIATELY, 0, 1, 0, &start)) {

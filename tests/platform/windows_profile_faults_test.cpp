@@ -42,7 +42,7 @@ class WindowsFaults : public ProfileTest {
 
 TEST_F(WindowsFaults, LeaveTheFileThatAnotherProgramHolds) {
   for (const DWORD others : {0UL, DWORD{FILE_SHARE_READ}}) {
-    const HANDLE held = Hold(m_file, others);
+    auto* const held = Hold(m_file, others);
     EXPECT_EQ(GetInt("x"), others == 0 ? 7 : 1);
     ExpectNothingStored(others == 0 ? "cannot be written: Permission denied"
                                     : "cannot be written: another program has it open");
@@ -53,7 +53,7 @@ TEST_F(WindowsFaults, LeaveTheFileThatAnotherProgramHolds) {
 }
 
 TEST_F(WindowsFaults, WaitForAProgramThatLetsGoOfTheFile) {
-  const HANDLE held = Hold(m_file, 0);
+  auto* const held = Hold(m_file, 0);
   g_afterSleep = [held] { CloseHandle(held); };
   EXPECT_EQ(GetInt("x"), 1);
   EXPECT_THAT(m_pProfile->TakeTroubles(), ElementsAre());
@@ -68,7 +68,7 @@ TEST_F(WindowsFaults, LeaveTheFileThatMayOnlyBeRead) {
 }
 
 TEST_F(WindowsFaults, WaitNoMoreThanASecondForAGameThatHasStopped) {
-  const HANDLE lock = Hold(fs::path(m_file) += ".lock", FILE_SHARE_READ | FILE_SHARE_WRITE);
+  auto* const lock = Hold(fs::path(m_file) += ".lock", FILE_SHARE_READ | FILE_SHARE_WRITE);
   ASSERT_TRUE(LockFile(lock, 0, 0, 1, 0));
   ExpectNothingStored("another running game holds it");
   EXPECT_GE(g_nMicrosecondsSlept, 900000);

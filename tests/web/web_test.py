@@ -145,6 +145,14 @@ class Game:
         page.wait_for("Zoë Ж 107")
         page.run("localStorage.clear()")
 
+    def test_tells_that_it_broke_down(self):
+        page = self.open()
+        page.run("setTimeout(abort)")
+        page.wait_until(page.ended, "the end")
+        self.assertIn("broke down", page.browser.find_element("id", "ended").text)
+        page.browser.find_element("id", "again").click()
+        page.wait_for("Wallet $100")
+
     def test_opens_the_help_and_goes_on_without_a_network(self):
         page = self.open()
         page.wait_until_kept()

@@ -10,7 +10,7 @@ const page = (function () {
   fullScreen.addEventListener('click', function () {
     if (document.fullscreenElement) document.exitFullscreen();
     else document.documentElement.requestFullscreen();
-    picture.canvas.focus({ preventScroll: true });
+    typing.focus();
   });
 
   if ('serviceWorker' in navigator && window.isSecureContext) {
@@ -41,9 +41,25 @@ const page = (function () {
   measure();
   picture.canvas.focus({ preventScroll: true });
 
+  /** Has a reader of the screen say this, also a second time. */
+  function say(text) { voice.textContent = text === voice.textContent ? text + '\u00a0' : text; }
+
+  function showEnd(text) {
+    document.body.classList.add('has_ended');
+    ended.querySelector('p').textContent = text;
+    ended.hidden = false;
+    document.getElementById('again').focus();
+    say(text);
+  }
+  /** A program that is broken, or could not be loaded, answers no more: only a new start helps. */
+  function seeWhetherBroken(thrown) {
+    if (thrown instanceof WebAssembly.RuntimeError) showEnd('The game broke down. What you confirmed is kept.');
+  }
+  window.addEventListener('error', function (event) { seeWhetherBroken(event.error); });
+  window.addEventListener('unhandledrejection', function (event) { seeWhetherBroken(event.reason); });
+
   return {
-    /** Has a reader of the screen say this, also a second time. */
-    say: function (text) { voice.textContent = text === voice.textContent ? text + '\u00a0' : text; },
+    say: say,
 
     /** One page of help for all that is asked; false where the browser does not let it open. */
     open: function (address) {
@@ -54,10 +70,7 @@ const page = (function () {
 
     end: function () {
       if (window.matchMedia('(display-mode: standalone)').matches) window.close();
-      document.body.classList.add('has_ended');
-      ended.hidden = false;
-      document.getElementById('again').focus();
-      page.say('The game has ended');
+      showEnd('The game has ended');
     },
   };
 })();

@@ -67,8 +67,10 @@ const typing = (function () {
       wanted = false;
       field.blur();
       field.disabled = true;
-      picture.canvas.focus({ preventScroll: true });
+      typing.focus();
     },
+    /** Keys go to the game again. */
+    focus: function () { (wanted ? field : picture.canvas).focus({ preventScroll: true }); },
 
     clipboard: function () { return pasted; },
     setClipboard: function (text) {
