@@ -45,15 +45,14 @@ def bet_button(name, live):
 
 
 def lamp(name, colours):
-    """A round lamp, lit, in a metal fitting; `colours` go from the rim of the glass to its middle.
+    """A round lamp, lit, set into the player box; `colours` are shade, body, glow and gleam.
 
-    The picture is copied as a block on a ground of any colour, so the fitting is square and has the
-    black outline of the box that it is set into; its plate is flat, as nothing happens when it is
-    pressed. The sign tells right from wrong without the colour.
+    The picture is copied as a block, so its corners have the colour that the box has at first; its
+    ring is black like the outline of the box. The sign tells right from wrong without the colour.
     """
-    picture = Canvas(13, 13, "black")
+    picture = Canvas(13, 13, "player_box")
     picture.text_grid(0, 0, read_grids(_SOURCES / "lamp.txt")["lamp"],
-                      {"#": "black", "p": "steel_light", "s": "steel", **dict(zip("dcl", colours))})
+                      {"#": "black", **dict(zip("dclh", colours))})
     sign(picture, 3, 3, name, "white")
     return picture
 
@@ -82,9 +81,9 @@ def make_all(output_dir):
     active_mark().save(output_dir / "134_active_mark.png", 16)
     word_button(73, "Insurance").save(output_dir / "139_insurance.png", 16)
     word_button(55, "Nope").save(output_dir / "143_no_insurance.png", 16)
-    green = ("lamp_green_rim", "lamp_green", "lamp_green_lit")
+    green = ("lamp_green_rim", "lamp_green", "lamp_green_lit", "green_light")
     lamp("check", green).save(output_dir / "141_lamp_green.png", 16)
-    red = ("lamp_red_rim", "card_red", "red")
+    red = ("lamp_red_rim", "card_red", "red", "red_light")
     lamp("cross", red).save(output_dir / "144_lamp_red.png", 16)
     for number, name, sign_name, live in (
         (136, "bet_up", "plus", True),

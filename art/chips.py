@@ -15,7 +15,6 @@ _SHADED = 12
 # Top, sunk middle, edge in the light, edge in the shade.
 RED = ("red", "card_red", "card_red", "red_dark")
 BLUE = ("blue_mid", "blue", "blue", "blue_dark")
-BLACK = ("grey_60", "ink", "grey_40", "ink")
 GOLD = ("gold_light", "gold", "gold", "gold_dark")
 
 

@@ -25,6 +25,8 @@ SCENE_PALETTE = {
     "button_face": (0xD4, 0xD0, 0xC8),
     # The game lays the mark over the table with AND: pure red keeps exactly the red part.
     "mark_red": (0xFF, 0x00, 0x00),
+    # What the lamps are set into: the player box, in its colour until a player changes it.
+    "player_box": (135, 180, 100),
     # The glass of the lamps.
     "lamp_green_rim": (0x00, 0x60, 0x18),
     "lamp_green": (0x00, 0x80, 0x28),

@@ -1,55 +1,59 @@
-"""The title picture: the name over a table that has a seat free. Hard pixels throughout."""
+"""The title picture: the name over three cards on a table. Hard pixels throughout."""
 
 import math
 from pathlib import Path
 
-import cards
 import chips
 import courts
 import nameplate
+from card_base import new_card
 from pixels import Canvas, read_grids
 
 WIDTH, HEIGHT = 96, 116
 
-# The felt's middle and half axes, and how much wider the rail around it is.
-_FELT = (48, 83.5, 40, 21)
-_RAIL = 6
-_RAIL_DEPTH = 4
+# The table's middle and half axes, the height of its side, and the colours of its rail from the
+# outside to the felt.
+_TABLE = (48.5, 83, 47, 28)
+_SIDE = 4
+_RAIL = ("wood_2", "wood_4", "wood_4", "wood_4", "wood_3", "wood_0")
 
-# Half a card's width and height in units of its lean, how much its corners lack in them, and how
-# many pixels it reaches from its middle. A pixel has as many of the units as the root of 17 says.
-_HALF_ACROSS, _HALF_ALONG, _BLUNT = 72, 97, 5
-_REACH = 30
+# A leaning card leans by a pixel in three. Half a card's width and height in thirds of a pixel, and
+# how much its corners lack in them; and a canvas that holds it however it leans.
+_STEP = 3
+_HALF_ACROSS, _HALF_ALONG, _BLUNT = 56, 74, 8
+_REACH = 28
+
 _SIGNS = read_grids(Path(__file__).resolve().parent / "sources" / "pictures" / "title.txt")
 
 
-def fill(picture, shape, colour):
-    """Fills the pixels whose middle a shape holds; `colour` is a name, or gives it at a point."""
-    for y in range(picture.height):
-        for x in range(picture.width):
-            if shape(x + 0.5, y + 0.5):
-                picture.put(x, y, colour(x + 0.5, y + 0.5) if callable(colour) else colour)
-
-
 def ellipse(x, y, rx, ry):
-    return lambda px, py: ((px - x) / rx) ** 2 + ((py - y) / ry) ** 2 < 1
+    """The pixels whose middle lies within an ellipse."""
+    return {(column, row) for column in range(WIDTH) for row in range(HEIGHT)
+            if ((column + 0.5 - x) / rx) ** 2 + ((row + 0.5 - y) / ry) ** 2 < 1}
+
+
+def within(shape):
+    """A shape without its outline, which is a line of single pixels."""
+    return {(x, y) for x, y in shape
+            if {(x - 1, y), (x + 1, y), (x, y - 1), (x, y + 1)} <= shape}
+
+
+def fill(picture, shape, colour, down=0):
+    for x, y in shape:
+        picture.put(x, y + down, colour)
 
 
 def table(picture):
-    x, y, rx, ry = _FELT
-
-    def grown(by, drop=0):
-        return ellipse(x, y + drop, rx + by, ry + by)
-
-    for drop in range(_RAIL_DEPTH, 0, -1):
-        fill(picture, grown(_RAIL, drop), "wood_0" if drop > 1 else "wood_1")
-    fill(picture, grown(_RAIL), lambda px, py: "wood_4" if py > y else "wood_2")
-    fill(picture, grown(4), "wood_5")
-    fill(picture, grown(3), "wood_3")
-    fill(picture, grown(1), "wood_0")
-    fill(picture, grown(0), lambda px, py: felt_colour(px - x, py - y + 3))
-    fill(picture, lambda px, py: ellipse(x, y, rx - 6, ry - 4.8)(px, py)
-         and not ellipse(x, y, rx - 7, ry - 5.8)(px, py), "felt_6")
+    """Draws the table, every ring of its rail parallel to the outermost; returns its felt."""
+    shape = ellipse(*_TABLE)
+    for down in range(_SIDE, 0, -1):
+        fill(picture, shape, "wood_0" if down == _SIDE else "wood_1", down)
+    for colour in _RAIL:
+        fill(picture, shape, colour)
+        shape = within(shape)
+    for x, y in shape:
+        picture.put(x, y, felt_colour(x + 0.5 - _TABLE[0], y + 3.5 - _TABLE[1]))
+    return shape
 
 
 def felt_colour(dx, dy):
@@ -58,89 +62,119 @@ def felt_colour(dx, dy):
     return f"felt_{max(3, min(6, round(7.4 - 4 * distance)))}"
 
 
-class LeaningCard:
-    """A large card that leans by a pixel in four, to the left (-1) or to the right (1).
+class Card:
+    """A large card that leans to the left (-1), to the right (1) or not at all (0).
 
     Its middle is (0, 0). Whole numbers along and across the lean say what belongs to it, so every
-    edge is a regular stair.
+    edge is a stair of equal steps, and what stands on it keeps its rows and only moves with them.
     """
 
     def __init__(self, lean):
         self._lean = lean
-        self.canvas = Canvas(2 * _REACH + 1, 2 * _REACH + 1, "nothing")
-        for y in range(-_REACH, _REACH + 1):
-            for x in range(-_REACH, _REACH + 1):
-                if self.holds(x, y):
-                    self.canvas.put(x + _REACH, y + _REACH, "ink" if self._ends(x, y) else "white")
+        self._canvas = Canvas(2 * _REACH + 1, 2 * _REACH + 1, "nothing")
+        reach = range(-_REACH, _REACH + 1)
+        self._shape = {(x, y) for y in reach for x in reach if self._holds(x, y)}
+        self._paper = within(self._shape)
+        for x, y in self._shape:
+            self._put(x, y, "white" if (x, y) in self._paper else "ink")
 
-    def holds(self, x, y):
-        across, along = abs(4 * x + self._lean * y), abs(4 * y - self._lean * x)
-        corner = across > _HALF_ACROSS - _BLUNT and along > _HALF_ALONG - _BLUNT
-        return across <= _HALF_ACROSS and along <= _HALF_ALONG and not corner
+    def _holds(self, x, y):
+        across = abs(_STEP * x + self._lean * y)
+        along = abs(_STEP * y - self._lean * x)
+        return (across <= _HALF_ACROSS and along <= _HALF_ALONG
+                and across + along <= _HALF_ACROSS + _HALF_ALONG - _BLUNT)
 
-    def _ends(self, x, y):
-        return not all(self.holds(x + dx, y + dy) for dx in (-1, 0, 1) for dy in (-1, 0, 1))
+    def _put(self, x, y, colour):
+        self._canvas.put(x + _REACH, y + _REACH, colour)
 
-    def lay(self, upright, x, y):
-        """Lays an upright drawing with its middle at a pixel, its rows moved on with the lean."""
-        left, top = _REACH + x - upright.width // 2, _REACH + y - upright.height // 2
-        for row in range(upright.height):
-            moved = self._lean * ((upright.height // 2 - row) // 4)
-            for column in range(upright.width):
-                if upright.get(column, row) != "nothing":
-                    self.canvas.put(left + column + moved, top + row, upright.get(column, row))
+    def lay(self, drawing, left, top):
+        """Lays an upright drawing on the paper; (left, top) is where its first row begins."""
+        for row in range(drawing.height):
+            moved = left - self._lean * (row // _STEP)
+            for column in range(drawing.width):
+                place, colour = (column + moved, top + row), drawing.get(column, row)
+                if colour != "nothing" and place in self._paper:
+                    self._put(*place, colour)
 
-    def sign_corners(self, places, colour):
-        """Sets signs, which lean of themselves, and the same upside down."""
-        corner = Canvas(self.canvas.width, self.canvas.height, "nothing")
-        for x, y, name in places:
-            corner.text_grid(_REACH + x, _REACH + y, _SIGNS[name], {"#": colour})
-        self.canvas.blit(corner, 0, 0, "nothing")
-        self.canvas.blit(corner.rotated180(), 0, 0, "nothing")
+    def lay_sign(self, name, colour, left, top):
+        self.lay(sign(name, colour), left, top)
+
+    def turn(self):
+        """Turns the card upside down, which keeps its lean."""
+        self._canvas = self._canvas.rotated180()
+
+    def shape(self, x, y):
+        """Its pixels with its middle at (x, y)."""
+        return {(x + column, y + row) for column, row in self._shape}
 
     def draw(self, picture, x, y):
-        picture.blit(self.canvas, x - _REACH, y - _REACH, "nothing")
+        picture.blit(self._canvas, x - _REACH, y - _REACH, "nothing")
 
 
-def ace_of_spades():
-    card = LeaningCard(1)
-    card.canvas.text_grid(_REACH - 8, _REACH - 9, _SIGNS["spade"], {"#": "ink"})
-    card.sign_corners(((-11, -22, "ace letter"), (-13, -13, "ace suit")), "ink")
-    return card
+def sign(name, colour):
+    grid = _SIGNS[name]
+    drawing = Canvas(max(map(len, grid)), len(grid), "nothing")
+    drawing.text_grid(0, 0, grid, {"#": colour})
+    return drawing
+
+
+def figure(suit, name, columns):
+    """The first columns of a court as the game's own card shows it, without its paper."""
+    card = new_card()
+    courts.draw(card, suit, name)
+    drawing = Canvas(columns, card.height - 2, "nothing")
+    for y in range(drawing.height):
+        for x in range(drawing.width):
+            if card.get(x + 1, y + 1) != "white":
+                drawing.put(x, y, card.get(x + 1, y + 1))
+    return drawing
 
 
 def queen_of_hearts():
-    """The game's own queen, as far to the right as the ace lets her be seen."""
-    card, small = LeaningCard(-1), cards.new_card()
-    courts.draw(small, "hearts", "queen")
-    figure = Canvas(17, small.height - 4, "nothing")
-    for y in range(figure.height):
-        for x in range(figure.width):
-            if small.get(x + 3, y + 2) != "white":
-                figure.put(x, y, small.get(x + 3, y + 2))
-    card.lay(figure, -2, 0)
-    card.sign_corners(((-19, -16, "queen letter"), (-19, -7, "queen suit")), "card_red")
+    """Its right side and so its second corner lie under the ace."""
+    card = Card(-1)
+    card.lay(figure("hearts", "queen", 20), -19, -16)
+    card.lay_sign("Q", "card_red", -20, -17)
+    card.lay_sign("heart", "card_red", -17, -8)
     return card
 
 
-def chip_stack(picture, x, y, count, colours):
-    shadow, felt = ellipse(x + 13, y + 7, 11, 4.5), ellipse(*_FELT)
-    fill(picture, lambda px, py: shadow(px, py) and felt(px, py), "felt_1")
+def king_of_spades():
+    """Its left side lies under the ace, so only the corner that stands on its head shows."""
+    card = Card(1)
+    card.lay_sign("K", "ink", -7, -22)
+    card.lay_sign("spade", "ink", -10, -13)
+    card.turn()
+    card.lay(figure("spades", "king", 27), -6, -17)
+    return card
+
+
+def ace_of_spades():
+    card = Card(0)
+    for _ in range(2):
+        card.lay_sign("A", "ink", -16, -21)
+        card.lay_sign("spade", "ink", -16, -12)
+        card.turn()
+    card.lay_sign("large spade", "ink", -9, -10)
+    return card
+
+
+def chip_stack(picture, felt, x, y, count, colours):
+    fill(picture, felt & ellipse(x + 13, y + 7, 11, 4.5), "felt_1")
     chips.stack(picture, x, y, count, colours)
 
 
 def title():
     picture = Canvas(WIDTH, HEIGHT)
-    table(picture)
-    fill(picture, ellipse(50, 82, 24, 6), "felt_1")
-    queen, ace = queen_of_hearts(), ace_of_spades()
-    fill(picture, lambda x, y: ellipse(*_FELT)(x, y) and (
-        queen.holds(int(x) - 38, int(y) - 58) or ace.holds(int(x) - 62, int(y) - 59)), "felt_1")
-    queen.draw(picture, 36, 54)
-    ace.draw(picture, 59, 55)
-    chip_stack(picture, 12, 88, 4, chips.RED)
-    chip_stack(picture, 65, 88, 3, chips.BLUE)
-    chip_stack(picture, 39, 94, 1, chips.BLACK)
+    felt = table(picture)
+    hand = ((queen_of_hearts(), 26, 54), (king_of_spades(), 70, 54), (ace_of_spades(), 48, 51))
+    for card, x, y in hand:
+        fill(picture, felt & card.shape(x, y + 3), "felt_1")
+    for card, x, y in hand:
+        card.draw(picture, x, y)
+    chip_stack(picture, felt, 13, 88, 4, chips.RED)
+    chip_stack(picture, felt, 65, 88, 3, chips.BLUE)
+    chip_stack(picture, felt, 39, 93, 2, chips.GOLD)
     nameplate.draw(picture, 4, 2, "felt_0", "brass_3", "felt_7", ("felt_5", "felt_4", "felt_3"))
     return picture
 
