@@ -1,11 +1,11 @@
 """The blackjack table: a quiet drawing on white, under everything that the game lays on it.
 
 The dealer stands at the top, so all arcs have their centre above the picture. The player box
-hides (12, 92)-(120, 176); the dealer's cards lie from (79, 10), the player's from (79, 217), and
-those of a split from (19, 217) and (139, 217), each with a total some pixels to the right of where
-five cards end, the last one up to (226, 257); the strategy button stands on the medallion. Nothing
-is darker than INK_LIMIT allows, so that dark red and black text keeps its contrast wherever it
-falls.
+hides (12, 92)-(120, 176) and the advice stands beside it, from (125, 139) down; the dealer's cards
+lie from (79, 10), the player's from (79, 217), and those of a split from (19, 217) and (139, 217),
+each with a total some pixels to the right of where five cards end, the last one up to (226, 257);
+the strategy button stands on the medallion. Nothing is darker than INK_LIMIT allows, so that dark
+red and black text keeps its contrast wherever it falls.
 """
 
 import math
@@ -18,18 +18,20 @@ WIDTH, HEIGHT = 240, 268
 # 255 - 226: the darkest step of the paper ramp.
 INK_LIMIT = 29
 
-_ARC_CENTRE = (120, -800)
+_ARC_CENTRE = (120, -585)
 _TEXT = "BLACKJACK PAYS 3 TO 2"
-_TEXT_TOP = 871
+_TEXT_TOP = 658.5
 _TEXT_UNIT = 10 / 6
 _TEXT_GAP = 1.9
 _TEXT_BLANK = 2.6
-_TEXT_STROKE = 0.58
+_TEXT_STROKE = 0.68
 
 _MEDALLION = (180, 118)
 # Radii: the band with the inscription, and the line that ends the player's field.
-_BAND_TOP, _PLAYERS_LINE = 862, 986
-_CLOTH_INK = 8
+_BAND_TOP, _PLAYERS_LINE = 650.5, 769
+_SUITS = ((135, 118), (150, 118), (210, 118), (225, 118),
+          (19, 187), (35, 189), (205, 189), (221, 187))
+_SUIT_HALF, _SUIT_INK = 5, 16
 _INSIDE_FRAME = 4
 # Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie
 # beside them.
@@ -117,38 +119,25 @@ def _lay_letter(paper, letter, place, width):
     paper.lay(on_arc, INK_LIMIT, (x - 9, y - 10, x + 9, y + 10))
 
 
-def _bare(x, y):
-    """Whether a small suit of the cloth has room at a point."""
-    radius = _arc_radius(x, y)
-    if radius < _BAND_TOP + 36 or abs(radius - _PLAYERS_LINE) < 8:
-        return False
-    if shapes.disc(*_MEDALLION, 33)(x, y):
-        return False
-    return 14 < x < WIDTH - 14 and y < _TRAYS[1][1] - 8
-
-
-def _lay_cloth(paper):
-    """Suits woven into the cloth, hardly seen."""
-    step = 20
-    for row in range(HEIGHT // step + 2):
-        for column in range(WIDTH // (2 * step) + 2):
-            x, y = 2 * step * column + (row % 2) * step, row * step - 6
-            if _bare(x, y):
-                paper.lay_placed(shapes.SUITS[(row + 2 * column) % 4], x, y, 5, _CLOTH_INK)
+def _lay_suits(paper):
+    """A suit in each corner of the player's field and two on either side of the medallion, where
+    neither box, advice nor buttons cover one by half."""
+    for suit, (x, y) in zip(shapes.SUITS * 2, _SUITS):
+        paper.lay_placed(suit, x, y, _SUIT_HALF, _SUIT_INK)
 
 
 def _lay_medallion(paper):
     x, y = _MEDALLION
     box = (x - 28, y - 28, x + 28, y + 28)
-    paper.lay(shapes.ring(x, y, 23.5, 25), INK_LIMIT, box)
-    paper.lay(shapes.ring(x, y, 16.5, 17.5), INK_LIMIT, box)
+    paper.lay(shapes.ring(x, y, 18.5, 20), INK_LIMIT, box)
+    paper.lay(shapes.ring(x, y, 13, 14), INK_LIMIT, box)
 
     def edge_marks(px, py):
         turn = math.atan2(py - y, px - x) / (2 * math.pi) * 8
-        return 17.5 <= math.hypot(px - x, py - y) < 23.5 and abs(turn - round(turn)) < 0.22
+        return 14 <= math.hypot(px - x, py - y) < 18.5 and abs(turn - round(turn)) < 0.22
 
     paper.lay(edge_marks, 16, box)
-    paper.lay_placed(shapes.spade, x, y - 0.5, 12, 20)
+    paper.lay_placed(shapes.spade, x, y - 0.5, 9, 20)
 
 
 def _lay_tray(paper, tray):
@@ -166,9 +155,9 @@ def _lay_frame(paper):
 
 def blackjack_table():
     paper = Paper()
-    _lay_cloth(paper)
+    _lay_suits(paper)
     for offset, width, ink in ((0, 1, 18), (2.5, 1.5, INK_LIMIT),
-                               (25, 1.5, INK_LIMIT), (28, 1, 18)):
+                               (21.5, 1.5, INK_LIMIT), (24.5, 1, 18)):
         paper.lay(_arc(_BAND_TOP + offset, _BAND_TOP + offset + width), ink)
     for offset, width, ink in ((-2, 1.2, 22), (1, 1, 14)):
         paper.lay(_arc(_PLAYERS_LINE + offset, _PLAYERS_LINE + offset + width), ink)
