@@ -18,8 +18,8 @@ struct ChangedText {
 };
 
 /// A TOML text, which can be understood, with the changes of a section in it and all else as it was
-/// but for its form. Nothing where the outcome could not be understood again: toml++ 3.3 forgets
-/// the quotation marks of some names.
+/// but for its form. Nothing where the outcome could not be understood again, as what was deep may
+/// have become deeper.
 std::optional<ChangedText> ChangeSection(const std::string& text, const std::string& section,
                                          const CProfileSection& change);
 
