@@ -9,7 +9,7 @@ FOLDER = ROOT / "docs" / "album" / "browser"
 
 def save(page, name):
     FOLDER.mkdir(parents=True, exist_ok=True)
-    page.screen().quantize(64).save(FOLDER / f"{name}.png", optimize=True)
+    page.screen().quantize(256).save(FOLDER / f"{name}.png", optimize=True)
 
 
 def open_page(browser, address, time, phone):
