@@ -5,6 +5,7 @@
 #include <filesystem>
 #include <fstream>
 #include <sstream>
+#include <stdexcept>
 
 #include "stylus/stylus_words.h"
 
@@ -60,11 +61,15 @@ void CGame::Give(const std::string& line) {
   while (stream >> word) {
     platform::InputEvent key;
     key.kind = platform::InputKind::kKey;
-    if (head == "stack") cards.push_back(ToCard(word));
-    if (head == "command") platform::TheApp().Queue().PostCommand(ToCommand(word));
-    if (head == "key") {
+    if (head == "stack") {
+      cards.push_back(ToCard(word));
+    } else if (head == "command") {
+      platform::TheApp().Queue().PostCommand(ToCommand(word));
+    } else if (head == "key") {
       key.stroke = platform::ParseChord(word).value();
       PutInput(key);
+    } else {
+      throw std::invalid_argument("no such line here: " + line);
     }
   }
   if (head == "stack") CTableState(View()).Stack(cards);

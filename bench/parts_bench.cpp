@@ -62,27 +62,39 @@ void Decode(benchmark::State& state, int number) {
   for (auto _ : state) benchmark::DoNotOptimize(pictures.ReadBitmap(number, {}));
 }
 
-/// A file as the game leaves it after a while.
-std::filesystem::path ProfileFile() {
-  auto file = std::filesystem::temp_directory_path() / "feltside-bench-profile" / "p.toml";
-  const auto profile = platform::OpenProfile(file);
-  profile->Update("Settings", [](platform::CProfileSection& section) {
+/// A file as the game leaves it after a while; it goes with this object.
+class CProfileFile {
+ public:
+  CProfileFile();
+  ~CProfileFile() { std::filesystem::remove_all(m_file.parent_path()); }
+  CProfileFile(const CProfileFile&) = delete;
+  CProfileFile& operator=(const CProfileFile&) = delete;
+
+  std::unique_ptr<platform::CProfile> Open() const { return platform::OpenProfile(m_file); }
+
+ private:
+  std::filesystem::path m_file =
+      std::filesystem::temp_directory_path() / "feltside-bench-profile" / "p.toml";
+};
+
+CProfileFile::CProfileFile() {
+  Open()->Update("Settings", [](platform::CProfileSection& section) {
     for (const char* name : {"GAME_TYPE", "USEHIGH", "FANCYVP", "FANCYBJ", "CARDBACK", "TABLECOLOR",
                              "BOXCOLOR", "VIDEODISCARDS", "STRATTYPE", "NUMDECKS", "PLAYSPEED"}) {
       section.Set(name, 1);
     }
     for (int i = 0; i < 5; ++i) section.Set("High" + std::to_string(i), "A Name 500");
   });
-  return file;
 }
 
 void StartProfile(benchmark::State& state) {
-  const auto file = ProfileFile();
-  for (auto _ : state) benchmark::DoNotOptimize(platform::OpenProfile(file)->Read());
+  const CProfileFile file;
+  for (auto _ : state) benchmark::DoNotOptimize(file.Open()->Read());
 }
 
 void StoreDialog(benchmark::State& state) {
-  const auto profile = platform::OpenProfile(ProfileFile());
+  const CProfileFile file;
+  const auto profile = file.Open();
   for (auto _ : state) {
     profile->Update("Settings", [](platform::CProfileSection& section) {
       for (const char* name : {"TABLECOLOR", "BOXCOLOR", "CARDBACK", "VIDEODISCARDS", "FANCYVP",
