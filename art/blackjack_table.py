@@ -28,9 +28,9 @@ _TEXT_STROKE = 0.68
 
 _MEDALLION = (180, 118)
 # Radii: the band with the inscription, and the line that ends the player's field.
-_BAND_TOP, _PLAYERS_LINE = 650.5, 769
+_BAND_TOP, _PLAYERS_LINE = 650.5, 772
 _SUITS = ((135, 118), (150, 118), (210, 118), (225, 118),
-          (19, 187), (35, 189), (205, 189), (221, 187))
+          (19, 191), (35, 193), (205, 193), (221, 191))
 _SUIT_HALF, _SUIT_INK = 5, 16
 _INSIDE_FRAME = 4
 # Cards lie in two long trays, alike: the player's may be one hand or two, and their totals lie
@@ -120,7 +120,7 @@ def _lay_letter(paper, letter, place, width):
 
 
 def _lay_suits(paper):
-    """A suit in each corner of the player's field and two on either side of the medallion, where
+    """Two suits on either side of the medallion and of the player's field, where
     neither box, advice nor buttons cover one by half."""
     for suit, (x, y) in zip(shapes.SUITS * 2, _SUITS):
         paper.lay_placed(suit, x, y, _SUIT_HALF, _SUIT_INK)

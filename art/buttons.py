@@ -7,6 +7,7 @@ from pixels import Canvas, read_grids
 
 _SOURCES = Path(__file__).resolve().parent / "sources" / "pictures"
 _SIGNS = read_grids(_SOURCES / "signs.txt")
+_LAMP = read_grids(_SOURCES / "lamp.txt")["lamp"]
 
 
 def raised(width, height):
@@ -44,16 +45,16 @@ def bet_button(name, live):
     return button
 
 
-def lamp(name, colours):
-    """A round lamp, lit, set into the player box; `colours` are shade, body, glow and gleam.
+def lamp(colour, name):
+    """A round lamp, lit, set into the player box.
 
-    The picture is copied as a block, so its corners have the colour that the box has at first; its
-    ring is black like the outline of the box. The sign tells right from wrong without the colour.
+    The picture is copied as a block, so its corners have the colour that the box has at first. The
+    sign tells right from wrong without the colour.
     """
     picture = Canvas(13, 13, "player_box")
-    picture.text_grid(0, 0, read_grids(_SOURCES / "lamp.txt")["lamp"],
-                      {"#": "black", **dict(zip("dclh", colours))})
-    sign(picture, 3, 3, name, "white")
+    parts = (("#", "ring"), ("d", "shade"), ("c", "body"), ("l", "glow"), ("h", "gleam"))
+    picture.text_grid(0, 0, _LAMP, {letter: f"lamp_{colour}_{part}" for letter, part in parts})
+    sign(picture, 4, 4, name, "white")
     return picture
 
 
@@ -65,7 +66,7 @@ def active_mark():
 
 def tool_bar():
     colours = {
-        "K": "ink", "W": "white", "R": "card_red", "r": "red_dark", "G": "lamp_green",
+        "K": "ink", "W": "white", "R": "card_red", "r": "red_dark", "G": "hit_green",
         "B": "blue",
     }
     bar = Canvas(80, 15, "nothing")
@@ -81,10 +82,8 @@ def make_all(output_dir):
     active_mark().save(output_dir / "134_active_mark.png", 16)
     word_button(73, "Insurance").save(output_dir / "139_insurance.png", 16)
     word_button(55, "Nope").save(output_dir / "143_no_insurance.png", 16)
-    green = ("lamp_green_rim", "lamp_green", "lamp_green_lit", "green_light")
-    lamp("check", green).save(output_dir / "141_lamp_green.png", 16)
-    red = ("lamp_red_rim", "card_red", "red", "red_light")
-    lamp("cross", red).save(output_dir / "144_lamp_red.png", 16)
+    lamp("green", "check").save(output_dir / "141_lamp_green.png", 16)
+    lamp("red", "cross").save(output_dir / "144_lamp_red.png", 16)
     for number, name, sign_name, live in (
         (136, "bet_up", "plus", True),
         (137, "bet_down", "minus", True),

@@ -98,15 +98,15 @@ def bulb(picture, x, y, lit):
 
 
 def marquee(picture):
-    box = (LEFT, 7, RIGHT, 37)
+    box = (LEFT, 6, RIGHT, 37)
     sunk_panel(picture, box, night(2))
     left, top, right, bottom = box
-    for place in range(28):
-        for y in (top + 1, bottom - 4):
-            bulb(picture, left + 6 + 8 * place, y, (place + (y > 20)) % 2 == 0)
-    BOLD.write_centred(picture, left, 72, 19, "VIDEO", "blue_light")
-    BOLD.write_centred(picture, 168, right, 19, "POKER", "blue_light")
-    nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 13, night(0), "brass_1", "gold_pale",
+    for row, y in enumerate((top + 1, bottom - 4)):
+        for place in range(28):
+            bulb(picture, left + 6 + 8 * place, y, (place + row) % 2 == 0)
+    BOLD.write_centred(picture, left, 72, 18, "VIDEO", "blue_light")
+    BOLD.write_centred(picture, 168, right, 18, "POKER", "blue_light")
+    nameplate.draw(picture, (WIDTH - nameplate.WIDTH) // 2, 12, night(0), "brass_1", "gold_pale",
                    ("gold_light", "gold", "brass_3"))
 
 
@@ -151,9 +151,9 @@ def button(picture):
     bevel(picture, grown(BUTTON, -1), "violet_light", "violet_dark")
     # The word's ink goes from 104 to 130: what stands before it and after it leaves as much room
     # beside the word, and the same at both ends of the button.
-    _small_card(picture, 82, 189, "card_red", "pink")
-    _small_card(picture, 87, 192, "white", "white")
-    sign(picture, 90, 197, "heart", "card_red")
+    _small_card(picture, 82, 190, "card_red", "pink")
+    _small_card(picture, 87, 193, "white", "white")
+    sign(picture, 90, 198, "heart", "card_red")
     sign(picture, 138, 195, "arrow", "violet_pale")
 
 

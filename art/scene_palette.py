@@ -27,11 +27,18 @@ SCENE_PALETTE = {
     "mark_red": (0xFF, 0x00, 0x00),
     # What the lamps are set into: the player box, in its colour until a player changes it.
     "player_box": (135, 180, 100),
-    # The glass of the lamps.
-    "lamp_green_rim": (0x00, 0x60, 0x18),
-    "lamp_green": (0x00, 0x80, 0x28),
-    "lamp_green_lit": (0x20, 0xA0, 0x40),
-    "lamp_red_rim": (0x90, 0x00, 0x10),
+    "lamp_green_ring": (0x00, 0x38, 0x10),
+    "lamp_green_shade": (0x00, 0x70, 0x18),
+    "lamp_green_body": (0x00, 0x98, 0x30),
+    "lamp_green_glow": (0x30, 0xC8, 0x50),
+    "lamp_green_gleam": (0xC0, 0xFF, 0xC0),
+    "lamp_red_ring": (0x60, 0x00, 0x08),
+    "lamp_red_shade": (0xA0, 0x00, 0x10),
+    "lamp_red_body": (0xD8, 0x08, 0x08),
+    "lamp_red_glow": (0xFF, 0x38, 0x30),
+    "lamp_red_gleam": (0xFF, 0xC0, 0xB8),
+    # The plus on the tool bar.
+    "hit_green": (0x00, 0x80, 0x28),
     # Paper of the blackjack table. Nothing darker: texts in dark red and black lie on it.
     **{f"paper_{level}": (level, level, level) for level in range(226, 255)},
     # Felt, wood and brass of the title picture.

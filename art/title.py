@@ -17,8 +17,9 @@ _TABLE = (48.5, 83, 47, 28)
 _SIDE = 4
 _RAIL = ("wood_2", "wood_4", "wood_4", "wood_4", "wood_3", "wood_0")
 
-# A leaning card leans by a pixel in three. Half a card's width and height in thirds of a pixel, and
-# how much its corners lack in them; and a canvas that holds it however it leans.
+# A leaning card leans by a pixel in three. Half a card's width and height in thirds of a pixel (a
+# leaning one comes out a twentieth smaller), and how much its corners lack in them; and a canvas
+# that holds it however it leans.
 _STEP = 3
 _HALF_ACROSS, _HALF_ALONG, _BLUNT = 56, 74, 8
 _REACH = 28

@@ -56,8 +56,8 @@ void CFeltsideView::DrawStrategy() {
 }
 
 bool CFeltsideView::IsAdviceShown() const {
-  return m_nStrategyMode == kStrategyAlways ||
-         (m_nStrategyMode == kStrategyButton && m_bShowAdvice != 0);
+  return m_nStrategyMode != kStrategyNone &&
+         (m_nStrategyMode != kStrategyButton || m_bShowAdvice != 0);
 }
 
 std::string CFeltsideView::AdviceText() const {
