@@ -130,7 +130,7 @@ TEST(Text, KeepsTheLettersOfTheGameApart) {
       "at av ay "                 // a tail runs out below a letter that stands free there
       "kj kJ "                    // a leg runs out above a hook
       "-1 -2 -3 -7 14 17 41 47 "  // there is room beside a stroke, a foot, a slope
-      "-v (+ -) +) r) ";          // or beside a bow
+      "-v (+ -) r) ";             // or beside a bow
   const std::set<std::string> texts = TextsOfTheGame();
   EXPECT_GT(texts.size(), 250U);
   const std::vector<Font> used = {{11}, {11, true}, {13}, {13, true}, {14, true}, {15, true}, {22}};
