@@ -141,12 +141,11 @@ def queen_of_hearts():
 
 
 def king_of_spades():
-    """Its left side lies under the ace, so only the corner that stands on its head shows."""
+    """Its left side lies under the ace, so its sign stands at the right, in the sword's place."""
     card = Card(1)
-    card.lay_sign("K", "ink", -7, -22)
-    card.lay_sign("spade", "ink", -10, -13)
-    card.turn()
-    card.lay(figure("spades", "king", 27), -6, -17)
+    card.lay(figure("spades", "king", 19), -5, -19)
+    card.lay_sign("K", "ink", 15, -14)
+    card.lay_sign("spade", "ink", 12, -5)
     return card
 
 
