@@ -1,4 +1,4 @@
-"""The title picture: the name over three cards on a table. Hard pixels throughout."""
+"""The title picture: the name over a blackjack on its table. Hard pixels throughout."""
 
 import math
 from pathlib import Path
@@ -17,9 +17,8 @@ _TABLE = (48.5, 83, 47, 28)
 _SIDE = 4
 _RAIL = ("wood_2", "wood_4", "wood_4", "wood_4", "wood_3", "wood_0")
 
-# A leaning card leans by a pixel in three. Half a card's width and height in thirds of a pixel (a
-# leaning one comes out a twentieth smaller), and how much its corners lack in them; and a canvas
-# that holds it however it leans.
+# A leaning card leans by a pixel in three. Half a card's width and height along that lean in
+# the same steps, how much its corners lack in them, and a canvas that holds it.
 _STEP = 3
 _HALF_ACROSS, _HALF_ALONG, _BLUNT = 56, 74, 8
 _REACH = 28
@@ -64,7 +63,7 @@ def felt_colour(dx, dy):
 
 
 class Card:
-    """A large card that leans to the left (-1), to the right (1) or not at all (0).
+    """A large card that leans to the left (-1) or to the right (1).
 
     Its middle is (0, 0). Whole numbers along and across the lean say what belongs to it, so every
     edge is a stair of equal steps, and what stands on it keeps its rows and only moves with them.
@@ -134,28 +133,19 @@ def figure(suit, name, columns):
 def queen_of_hearts():
     """Its right side and so its second corner lie under the ace."""
     card = Card(-1)
-    card.lay(figure("hearts", "queen", 20), -19, -16)
+    card.lay(figure("hearts", "queen", 26), -19, -16)
     card.lay_sign("Q", "card_red", -20, -17)
     card.lay_sign("heart", "card_red", -17, -8)
     return card
 
 
-def king_of_spades():
-    """Its left side lies under the ace, so its sign stands at the right, in the sword's place."""
-    card = Card(1)
-    card.lay(figure("spades", "king", 19), -5, -19)
-    card.lay_sign("K", "ink", 15, -14)
-    card.lay_sign("spade", "ink", 12, -5)
-    return card
-
-
 def ace_of_spades():
-    card = Card(0)
+    card = Card(1)
     for _ in range(2):
-        card.lay_sign("A", "ink", -16, -21)
-        card.lay_sign("spade", "ink", -16, -12)
+        card.lay_sign("A", "ink", -7, -21)
+        card.lay_sign("spade", "ink", -9, -12)
         card.turn()
-    card.lay_sign("large spade", "ink", -9, -10)
+    card.lay_sign("large spade", "ink", -7, -7)
     return card
 
 
@@ -167,7 +157,7 @@ def chip_stack(picture, felt, x, y, count, colours):
 def title():
     picture = Canvas(WIDTH, HEIGHT)
     felt = table(picture)
-    hand = ((queen_of_hearts(), 26, 54), (king_of_spades(), 70, 54), (ace_of_spades(), 48, 51))
+    hand = ((queen_of_hearts(), 35, 53), (ace_of_spades(), 60, 54))
     for card, x, y in hand:
         fill(picture, felt & card.shape(x, y + 3), "felt_1")
     for card, x, y in hand:
