@@ -54,7 +54,7 @@ def lamp(colour, name):
     picture = Canvas(13, 13, "player_box")
     parts = (("#", "ring"), ("d", "shade"), ("c", "body"), ("l", "glow"), ("h", "gleam"))
     picture.text_grid(0, 0, _LAMP, {letter: f"lamp_{colour}_{part}" for letter, part in parts})
-    sign(picture, 4, 4, name, "white")
+    sign(picture, 3, 3, name, "white")
     return picture
 
 

@@ -1,4 +1,4 @@
-"""The title picture: the name over a blackjack on its table. Hard pixels throughout."""
+"""The title picture: the name over a fan of three cards on a table. Hard pixels throughout."""
 
 import math
 from pathlib import Path
@@ -17,8 +17,9 @@ _TABLE = (48.5, 83, 47, 28)
 _SIDE = 4
 _RAIL = ("wood_2", "wood_4", "wood_4", "wood_4", "wood_3", "wood_0")
 
-# A leaning card leans by a pixel in three. Half a card's width and height along that lean in
-# the same steps, how much its corners lack in them, and a canvas that holds it.
+# A leaning card leans by a pixel in three. Half a card's width and height in thirds of a pixel (a
+# leaning one comes out a twentieth smaller), and how much its corners lack in them; and a canvas
+# that holds it however it leans.
 _STEP = 3
 _HALF_ACROSS, _HALF_ALONG, _BLUNT = 56, 74, 8
 _REACH = 28
@@ -63,10 +64,11 @@ def felt_colour(dx, dy):
 
 
 class Card:
-    """A large card that leans to the left (-1) or to the right (1).
+    """A large card that leans to the left (-1), to the right (1) or not at all (0).
 
     Its middle is (0, 0). Whole numbers along and across the lean say what belongs to it, so every
-    edge is a stair of equal steps, and what stands on it keeps its rows and only moves with them.
+    edge is a stair of equal steps. A figure on it keeps its rows and only moves with them; a sign
+    stays upright.
     """
 
     def __init__(self, lean):
@@ -76,7 +78,7 @@ class Card:
         self._shape = {(x, y) for y in reach for x in reach if self._holds(x, y)}
         self._paper = within(self._shape)
         for x, y in self._shape:
-            self._put(x, y, "white" if (x, y) in self._paper else "ink")
+            self._put(x, y, "white" if (x, y) in self._paper else "grey_60")
 
     def _holds(self, x, y):
         across = abs(_STEP * x + self._lean * y)
@@ -87,17 +89,27 @@ class Card:
     def _put(self, x, y, colour):
         self._canvas.put(x + _REACH, y + _REACH, colour)
 
-    def lay(self, drawing, left, top):
-        """Lays an upright drawing on the paper; (left, top) is where its first row begins."""
+    def _lay(self, drawing, left, top, lean):
         for row in range(drawing.height):
-            moved = left - self._lean * (row // _STEP)
+            moved = left - lean * (row // _STEP)
             for column in range(drawing.width):
                 place, colour = (column + moved, top + row), drawing.get(column, row)
                 if colour != "nothing" and place in self._paper:
                     self._put(*place, colour)
 
+    def lay_figure(self, drawing, left, top):
+        """Lays an upright drawing on the paper; (left, top) is where its first row begins."""
+        self._lay(drawing, left, top, self._lean)
+
     def lay_sign(self, name, colour, left, top):
-        self.lay(sign(name, colour), left, top)
+        self._lay(sign(name, colour), left, top, 0)
+
+    def darken(self, shape, x, y):
+        """Lets a shadow fall on the paper: a shape, as seen with the card's middle at (x, y)."""
+        for column, row in self._paper:
+            at = (column + _REACH, row + _REACH)
+            if (column + x, row + y) in shape and self._canvas.get(*at) == "white":
+                self._canvas.put(*at, "grey_d8")
 
     def turn(self):
         """Turns the card upside down, which keeps its lean."""
@@ -133,19 +145,28 @@ def figure(suit, name, columns):
 def queen_of_hearts():
     """Its right side and so its second corner lie under the ace."""
     card = Card(-1)
-    card.lay(figure("hearts", "queen", 26), -19, -16)
-    card.lay_sign("Q", "card_red", -20, -17)
-    card.lay_sign("heart", "card_red", -17, -8)
+    card.lay_figure(figure("hearts", "queen", 20), -19, -16)
+    card.lay_sign("Q", "card_red", -21, -16)
+    card.lay_sign("heart", "card_red", -19, -7)
+    return card
+
+
+def king_of_spades():
+    """Its left side lies under the ace, so its sign stands at the right, in the sword's place."""
+    card = Card(1)
+    card.lay_figure(figure("spades", "king", 19), -5, -19)
+    card.lay_sign("K", "ink", 14, -14)
+    card.lay_sign("spade", "ink", 12, -5)
     return card
 
 
 def ace_of_spades():
-    card = Card(1)
+    card = Card(0)
     for _ in range(2):
-        card.lay_sign("A", "ink", -7, -21)
-        card.lay_sign("spade", "ink", -9, -12)
+        card.lay_sign("A", "ink", -16, -21)
+        card.lay_sign("spade", "ink", -16, -12)
         card.turn()
-    card.lay_sign("large spade", "ink", -7, -7)
+    card.lay_sign("large spade", "ink", -9, -10)
     return card
 
 
@@ -157,9 +178,13 @@ def chip_stack(picture, felt, x, y, count, colours):
 def title():
     picture = Canvas(WIDTH, HEIGHT)
     felt = table(picture)
-    hand = ((queen_of_hearts(), 35, 53), (ace_of_spades(), 60, 54))
+    ace = ace_of_spades()
+    below = ((queen_of_hearts(), 26, 54), (king_of_spades(), 70, 54))
+    hand = (*below, (ace, 48, 51))
     for card, x, y in hand:
         fill(picture, felt & card.shape(x, y + 3), "felt_1")
+    for card, x, y in below:
+        card.darken(ace.shape(46, 53) | ace.shape(50, 53), x, y)
     for card, x, y in hand:
         card.draw(picture, x, y)
     chip_stack(picture, felt, 13, 88, 4, chips.RED)
