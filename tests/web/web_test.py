@@ -282,8 +282,15 @@ class Store(WebTest):
         page = self.open()
         self.assertEqual(shown(), version)
         self.assertTrue(page.worker("r.waiting !== null"))
+
+        def has_changed():
+            self.open()
+            if shown() != version:
+                return True
+            self.browser.get("about:blank")  # the browser needs a moment without the game
+            return False
         self.browser.get("about:blank")
-        page.wait_until(lambda: self.open() and shown() != version, "the change")
+        page.wait_until(has_changed, "the change")
         self.assertEqual(shown(), "newer0000000")
 
 
