@@ -33,7 +33,6 @@ void CTableLayout::DrawPlayerBox(int stake, double wallet, bool handInProgress) 
   const Rect box = BoxRect();
   const platform::SavedState saved(*m_pDC);
   m_pDC->SetBrush(m_crBox);
-  m_pDC->SetPen(platform::kBlack);
   m_pDC->SetBackColor(m_crBox);
   m_pDC->SetTextColor(platform::kBlack);
   m_pDC->Rectangle(box);

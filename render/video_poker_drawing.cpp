@@ -37,7 +37,6 @@ void CTableLayout::DrawPayTable() const {
   const platform::Size number = m_pDC->TextExtent(kWidestNumber);
   m_pDC->SetBrush(platform::kWhite);
   m_pDC->SetBackColor(platform::kWhite);
-  m_pDC->SetPen(platform::kBlack);
   m_pDC->Rectangle({m_rcTable.left + 2, m_rcTable.top + 2, m_rcTable.right - 2, bottom});
   m_pDC->Line({Center().x, 0}, {Center().x, bottom});
   for (int row = 0; row < static_cast<int>(kPayRows.size()); ++row) {
@@ -64,7 +63,6 @@ void CTableLayout::DrawPlayButton(bool deal) const {
   const platform::Size extent = m_pDC->TextExtent(text);
   m_pDC->SetBrush(kButtonColor);
   m_pDC->SetBackColor(kButtonColor);
-  m_pDC->SetPen(platform::kBlack);
   m_pDC->Rectangle(button);
   m_pDC->TextOut({(button.left + button.right) / 2 - extent.width / 2,
                   (button.top + button.bottom) / 2 - extent.height / 2},

@@ -22,8 +22,6 @@ void CFeltsideView::DealVideoPoker() {
   m_bDrawPending = 1;
   m_dWallet -= kStake;
   if (m_deck1.GetPosition() < kReshuffleBelow) m_deck1.Shuffle();
-  m_handPoker.SetLimit(kPokerCards);
-  m_layout.m_nRowCards = kPokerCards;
   m_handPoker.Clear();
   for (int i = 0; i < kPokerCards; ++i) {
     const int card = DrawFrom(m_deck1, {&m_handPoker});

@@ -279,7 +279,6 @@ void CDialog::OnMouseMove(Point p) {
 }
 
 void CDialog::OnPressLost() {
-  m_bMoving = false;
   m_bInside = false;
   m_rcPressed = {};
   Invalidate();

@@ -96,7 +96,7 @@ class CDialog : public CTopWindow {
   std::vector<std::unique_ptr<CControl>> m_arrControls;
   bool m_bEnded = false;
   int m_nResult = kResultCancel;
-  bool m_bMoving = false;
+  bool m_bMoving = false;  ///< under the stylus that is down, by its caption
   Point m_ptGrip;          ///< where the caption was taken
   Rect m_rcPressed;        ///< the caption's button that the stylus went down on; empty: none
   bool m_bInside = false;  ///< still on it

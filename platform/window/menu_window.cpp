@@ -99,11 +99,6 @@ void CMenuWindow::Select(int line) {
   Invalidate();
 }
 
-void CMenuWindow::SelectFirst() {
-  m_nSelected = -1;
-  Step(1);
-}
-
 void CMenuWindow::Step(int direction) {
   const int count = static_cast<int>(m_arrLines.size());
   int line = m_nSelected < 0 && direction < 0 ? 0 : m_nSelected;

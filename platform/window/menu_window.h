@@ -32,8 +32,8 @@ class CMenuWindow : public CTopWindow {
   /// when it opens. What is called when it has closed must not destroy it.
   CMenuWindow(const MenuTemplate& menu, Point at, std::function<void()> onClosed);
 
-  /// Highlights the first item, as a menu opened by a key does.
-  void SelectFirst();
+  /// Highlights the first item of a menu that has just opened, as one opened by a key does.
+  void SelectFirst() { Step(1); }
 
   /// The title and the line under the highlight.
   Phrases Words() const override;

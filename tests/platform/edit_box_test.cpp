@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "platform/draw/look.h"
 #include "shell/res/dialog_templates.h"
 #include "tests/support/desk.h"
 #include "tests/support/golden.h"
@@ -63,6 +64,8 @@ TEST_F(NameEdit, TakesWhatIsMarkedElsewhereWhereTheMiddleButtonPoints) {
 
 TEST_F(NameEdit, ShowsACompositionWhereItWillStand) {
   Put(InputKind::kText, "Annae");
+  const int end = 4 + MeasureText(platform::kSystemFont, "Annae").width;
+  EXPECT_EQ(CaretPlace(), (platform::Rect{end - 1, 0, end, Edit().GetPlace().Height()}));
   PutKeys({"Left", "Left", "Shift+Right"});
   const platform::Rect before = CaretPlace();
   Put(InputKind::kComposition, "");
