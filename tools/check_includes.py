@@ -53,7 +53,8 @@ LIBRARIES = [
     (r"platform/store/\w+\.cpp", rf"toml\+\+/.*|{SYSTEM}"),
     (r"(platform/\w+|tests/\w+)/windows_\w+\.cpp", WINDOWS),
     (r"stylus/.*", JSON),
-    (r"tests/platform/sdl_\w+\.cpp", SDL),
+    (r"tests/platform/(posix_)?sdl_\w+\.cpp", SDL),
+    (r"tests/platform/posix_sdl_\w+\.cpp", r"dlfcn\.h"),
     (r"tests/.*", f"{GTEST}|{JSON}|{SYSTEM}"),
     (r"bench/.*", f"{SDL}|{SYSTEM}|dlfcn\\.h|benchmark/benchmark\\.h"),
     (r"fuzz/profile\.cpp", r"toml\+\+/.*"),
@@ -125,7 +126,7 @@ class Checker:
         """Even by name the libraries are known to the layer alone, and to what the game is measured
         against."""
         if re.fullmatch(r"platform/\w+/(\w+\.cpp|sdl_\w+\.h)|bench/\w+\.(cpp|h)|"
-                        r"(tests/platform/sdl_\w+|fuzz/profile)\.cpp", path):
+                        r"(tests/platform/(posix_)?sdl_\w+|fuzz/profile)\.cpp", path):
             return
         for number, line in enumerate(without_comments(text).splitlines(), 1):
             if match := LIBRARY_NAME.search(line):

@@ -13,31 +13,17 @@ void SdlCanvas::Prepare(bool plain) {
 bool SdlCanvas::Open(SDL_Window* window, bool plain) {
   m_pWindow = window;
   if (plain) return SDL_GetWindowSurface(window) != nullptr;
-  m_pRenderer = SDL_CreateRenderer(window, -1, 0);
+  m_pRenderer.reset(SDL_CreateRenderer(window, -1, 0));
   return m_pRenderer != nullptr;
 }
 
-void SdlCanvas::Close() {
-  if (m_pTexture != nullptr) SDL_DestroyTexture(m_pTexture);
-  if (m_pRenderer != nullptr) SDL_DestroyRenderer(m_pRenderer);
-  m_pTexture = nullptr;
-  m_pRenderer = nullptr;
-}
-
 SDL_Surface* SdlCanvas::Begin() {
-  return m_pRenderer == nullptr ? SDL_GetWindowSurface(m_pWindow) : LockTexture();
-}
-
-SDL_Surface* SdlCanvas::LockTexture() {
+  if (m_pRenderer == nullptr) return SDL_GetWindowSurface(m_pWindow);
   int width = 0;
   int height = 0;
-  SDL_GetRendererOutputSize(m_pRenderer, &width, &height);
-  if (m_pTexture != nullptr) SDL_DestroyTexture(m_pTexture);
-  m_pTexture = SDL_CreateTexture(m_pRenderer, SDL_PIXELFORMAT_ARGB8888, SDL_TEXTUREACCESS_STREAMING,
-                                 width, height);
-  SDL_Surface* surface = nullptr;
-  if (m_pTexture != nullptr) SDL_LockTextureToSurface(m_pTexture, nullptr, &surface);
-  return surface;
+  SDL_GetRendererOutputSize(m_pRenderer.get(), &width, &height);
+  m_pPicture.reset(SDL_CreateRGBSurfaceWithFormat(0, width, height, 32, SDL_PIXELFORMAT_ARGB8888));
+  return m_pPicture.get();
 }
 
 void SdlCanvas::End() {
@@ -45,9 +31,11 @@ void SdlCanvas::End() {
     SDL_UpdateWindowSurface(m_pWindow);
     return;
   }
-  SDL_UnlockTexture(m_pTexture);
-  SDL_RenderCopy(m_pRenderer, m_pTexture, nullptr, nullptr);
-  SDL_RenderPresent(m_pRenderer);
+  SDL_Renderer* const renderer = m_pRenderer.get();
+  const std::unique_ptr<SDL_Texture, Gone> texture(
+      SDL_CreateTextureFromSurface(renderer, m_pPicture.get()));
+  SDL_RenderCopy(renderer, texture.get(), nullptr, nullptr);
+  SDL_RenderPresent(renderer);
 }
 
 }  // namespace platform

@@ -65,10 +65,11 @@ class FontLibrary : public SdlLibrary {
 FontFile FindDesktopFont(char32_t character) {
   static const FontLibrary library;
   if (!library.IsComplete()) return {};
-  // Letters are drawn from outlines, in one colour.
+  // Letters are drawn from outlines, in one colour. A size would follow a bare hyphen.
   std::array<char, 80> description{};
   std::snprintf(description.data(), description.size(),
-                "sans-serif:charset=%x:outline=true:color=false", static_cast<unsigned>(character));
+                "sans\\-serif:charset=%x:outline=true:color=false",
+                static_cast<unsigned>(character));
   return library.Match(description.data());
 }
 

@@ -64,6 +64,20 @@ class SdlHostTest : public testing::Test {
     SDL_strlcpy(raw.text.text, text, sizeof raw.text.text);
     SDL_PushEvent(&raw);
   }
+  /// A move, or the wheel, there.
+  static void PutMotion(Uint32 type, Point at) {
+    SDL_Event raw{};
+    raw.type = type;
+    if (type == SDL_MOUSEWHEEL) {
+      raw.wheel.y = 1;
+      raw.wheel.mouseX = at.x;
+      raw.wheel.mouseY = at.y;
+    } else {
+      raw.motion.x = at.x;
+      raw.motion.y = at.y;
+    }
+    SDL_PushEvent(&raw);
+  }
   static void PutButton(Uint32 type, Uint8 button, Point at) {
     SDL_Event raw{};
     raw.type = type;
@@ -209,11 +223,15 @@ TEST_F(SdlHostTest, RefusesWhatIsDropped) {
   EXPECT_EQ(SDL_GetEventState(SDL_DROPTEXT), SDL_DISABLE);
 }
 
+Pixel PixelOf(const SDL_Surface& screen, Point at) {
+  const auto* line = static_cast<const Uint8*>(screen.pixels) + std::ptrdiff_t{screen.pitch} * at.y;
+  return reinterpret_cast<const Pixel*>(line)[at.x] & 0xFFFFFFU;
+}
+
 /// Whether a place of the window shows a pixel of the frame, mixed with no more than as much of its
 /// neighbours.
 bool IsSeenAt(const SDL_Surface& screen, Point at, Point inFrame) {
-  const auto* line = static_cast<const Uint8*>(screen.pixels) + std::ptrdiff_t{screen.pitch} * at.y;
-  const Pixel pixel = reinterpret_cast<const Pixel*>(line)[at.x];
+  const Pixel pixel = PixelOf(screen, at);
   const auto is = [](Pixel level, int cell) {
     return std::abs(static_cast<int>(level & 0xFF) - cell * kStep) <= kStep / 2 + 1;
   };
@@ -228,9 +246,13 @@ TEST_F(SdlHostTest, HitsWhatIsSeenAtEverySize) {
     EXPECT_FALSE(Next());
     const SDL_Surface& screen = *SDL_GetWindowSurface(Window());
     const Rect place = platform::FrameFit(kFrame, size).Place();
+    if (!place.Contains({})) {
+      EXPECT_EQ(PixelOf(screen, {}), 0x202020U);
+    }
     for (int y = place.top; y < place.bottom; ++y) {
       const Point at{place.left + y % place.Width(), y};
-      PutButton(SDL_MOUSEBUTTONDOWN, SDL_BUTTON_LEFT, at);
+      if (y % 2 == 0) PutButton(SDL_MOUSEBUTTONDOWN, SDL_BUTTON_LEFT, at);
+      if (y % 2 == 1) PutMotion(y % 4 == 1 ? SDL_MOUSEMOTION : SDL_MOUSEWHEEL, at);
       EXPECT_TRUE(IsSeenAt(screen, at, Next().value().at)) << size.width << " " << at.x << " " << y;
     }
   }
@@ -250,12 +272,12 @@ TEST_F(SdlHostTest, FillsTheDisplayAndComesBack) {
 }
 
 TEST_F(SdlHostTest, OpensWhereItIsPutAndTellsWhereItWasMoved) {
-  m_pHost->SetWindowPlace({{5000, 100, 5300, 400}, false});
+  m_pHost->SetWindowPlace({{5000, 10, 5300, 310}, false});
   m_pHost->Show(m_frame);
   const Rect opened = m_pHost->GetWindowPlace().value().rect;
   SDL_Rect display;
   SDL_GetDisplayBounds(0, &display);
-  EXPECT_EQ(opened, platform::RectAt({display.w - 300, 100}, {300, 300}));
+  EXPECT_EQ(opened, platform::RectAt({display.w - 300, 10}, {300, 300}));
   const Rect moved{20, 30, 320, 400};
   PutWindowAt(moved);
   EXPECT_FALSE(Next());
