@@ -2,8 +2,6 @@
 
 #include <utf8cpp/utf8.h>
 
-#include <algorithm>
-
 namespace platform {
 namespace {
 
@@ -38,8 +36,7 @@ std::size_t NextLetter(const std::string& text, std::size_t at) {
 
 char32_t CharacterAt(const std::string& text, std::size_t at) {
   const char* letter = text.data() + at;
-  constexpr std::size_t kLongest = 4;
-  const char* end = letter + std::min(kLongest, text.size() - at);
+  const char* end = text.data() + NextLetter(text, at);
   return utf8::find_invalid(letter, end) == letter ? kNoCharacter
                                                    : utf8::unchecked::peek_next(letter);
 }

@@ -13,6 +13,7 @@ inline int g_nBeforeRefusal = -1;       ///< so many that do not throw still suc
 inline bool g_bRefusesOnce = false;     ///< only the one after those fails
 inline bool g_bSleepsInNoTime = false;  ///< usleep only moves the clock
 inline long g_nMicrosecondsSlept = 0;   ///< in that way
-inline std::function<void()> g_afterSleep;  ///< happens once, during the next such sleep
+inline std::function<void(int descriptor)> g_onFlush;  ///< sees what is being flushed
+inline std::function<void()> g_afterSleep;             ///< happens once, during the next such sleep
 
 }  // namespace feltside::tests

@@ -22,6 +22,7 @@ extern "C" ssize_t read(int descriptor, void* buffer, std::size_t size) {
 }
 
 extern "C" int fsync(int descriptor) {
+  if (g_onFlush) g_onFlush(descriptor);
   return g_bFlushFails ? Fail() : static_cast<int>(syscall(SYS_fsync, descriptor));
 }
 

@@ -3,6 +3,7 @@
 #include <fcntl.h>
 #include <gmock/gmock.h>
 #include <sys/file.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -96,13 +97,27 @@ TEST_F(ProfileTest, StoresAllOrNothingWhenMemoryRunsOut) {
   }
 }
 
-TEST_F(ProfileTest, KeepsThePermissionsOfTheFile) {
-  constexpr auto kPermissions =
-      fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read;
-  WriteFile(m_file, "[S]\nx = 1\n");
-  fs::permissions(m_file, kPermissions);
+TEST_F(ProfileTest, IsTheOwnersUnlessTheOwnerSharesIt) {
+  constexpr auto kOwn = fs::perms::owner_read | fs::perms::owner_write;
+  constexpr auto kShared = kOwn | fs::perms::group_read;
+  std::vector<mode_t> flushed;
+  g_onFlush = [&flushed](int descriptor) {
+    struct stat status {};
+    fstat(descriptor, &status);
+    flushed.push_back(status.st_mode);
+  };
+  EXPECT_TRUE(Store("x", 1));
+  g_onFlush = nullptr;
+  // The fresh file, and the folder in which it then takes the old one's name.
+  ASSERT_EQ(flushed.size(), 2U);
+  EXPECT_EQ(flushed[0], mode_t{S_IFREG | 0600});
+  EXPECT_TRUE(S_ISDIR(flushed[1]));
+  for (const char* ending : {"", ".lock"}) {
+    EXPECT_EQ(fs::status(fs::path(m_file) += ending).permissions(), kOwn) << ending;
+  }
+  fs::permissions(m_file, kShared);
   EXPECT_TRUE(Store("x", 2));
-  EXPECT_EQ(fs::status(m_file).permissions(), kPermissions);
+  EXPECT_EQ(fs::status(m_file).permissions(), kShared);
 }
 
 class LongNameTest : public ProfileTest {

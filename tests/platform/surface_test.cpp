@@ -60,6 +60,13 @@ TEST(Surface, DrawsInsideItsBoundsAndThePictureOnly) {
   }
 }
 
+TEST(Bitmap, HasNoPixelsWithoutWidthOrHeight) {
+  for (const Size size : {Size{-1, 5}, {0, 5}, {5, 0}, {5, -1}}) {
+    EXPECT_TRUE(CBitmap(size).Pixels().empty()) << size.width;
+    EXPECT_TRUE(CBitmap::SeeThrough(size).Pixels().empty()) << size.width;
+  }
+}
+
 TEST(Resources, ShowABlankWithItsNumberForAPictureThatIsMissing) {
   CResources none({nullptr, 0});
   CBitmap expected({29, 41});
