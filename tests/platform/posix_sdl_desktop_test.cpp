@@ -208,7 +208,7 @@ TEST_F(SdlDesktopTest, StandsBelowTheBarAndDoesNotWander) {
   struct Case {
     Rect asked;
     Rect seen;
-    int told;  ///< a bar above what is seen
+    int told = 0;  ///< a bar above what is seen
   };
   const CBitmap frame(kFrame);
   for (const Case& c : {Case{{100, 200, 400, 500}, {100, 220, 400, 520}, 200},
