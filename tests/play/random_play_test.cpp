@@ -16,7 +16,7 @@
 namespace feltside::tests {
 namespace {
 
-constexpr int kCommands = 10000;
+constexpr int kCommands = 5000;
 constexpr int kLeaveEvery = 200;  ///< commands until all dialogs are left
 constexpr int kListenEvery = 7;   ///< commands until it is heard what was said
 constexpr int kMostEscapes = 6;

@@ -79,7 +79,7 @@ void CheckTable(Stylus& stylus, const Json& state, Texts texts) {
   }
   ExpectReadable(shot, texts, StylesOn(state["m_bFancyBlackjack"] == 0));
   // Every operation has painted what it changed: painting anew brings nothing else.
-  stylus.Send("wallet " + state["m_dWallet"].dump());
+  stylus.Send("wallet " + ToText(state["m_dWallet"]));
   EXPECT_EQ(stylus.Shot(), shot);
 }
 

@@ -108,6 +108,8 @@ CTableState Desk::Table() const {
   return CTableState(static_cast<CFeltsideView&>(platform::TheApp().MainFrame()->View()));
 }
 
+Json Desk::State() const { return ReadJson(Table().Read().dump()); }
+
 void Desk::Post(const platform::Message& message) { platform::TheApp().Queue().Post(message); }
 
 void Desk::Command(int commandID) {

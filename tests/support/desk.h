@@ -50,7 +50,7 @@ class Desk {
   DeskHost& Host() { return m_host; }
   CTableState Table() const;
   /// The members of the table.
-  Json State() const { return Json::parse(Table().Read().dump()); }
+  Json State() const;
   /// The topmost window, which must be a dialog.
   platform::CDialog* Dialog() const;
 

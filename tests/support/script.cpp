@@ -154,7 +154,7 @@ class Player {
       EXPECT_EQ(Program().Shot(), m_looks.at(expected.substr(6)));
     } else {
       const std::string path = expected.substr(0, expected.find(' '));
-      EXPECT_EQ(Find(answer, path), Json::parse(expected.substr(path.size()))) << path;
+      EXPECT_EQ(Find(answer, path), ReadJson(expected.substr(path.size()))) << path;
     }
   }
 
@@ -213,7 +213,7 @@ std::string Missing(const Json& actual, const Json& expected) {
     } else if (value.is_object()) {
       text += Missing(actual[name], value);
     } else if (actual[name] != value) {
-      text += name + " is " + actual[name].dump() + ", not " + value.dump() + "\n";
+      text += name + " is " + ToText(actual[name]) + ", not " + ToText(value) + "\n";
     }
   }
   return text;

@@ -11,6 +11,10 @@
 
 namespace feltside::tests {
 
+Json ReadJson(const std::string& text) { return Json::parse(text); }
+
+std::string ToText(const Json& value) { return value.dump(); }
+
 Stylus::Stylus(const std::string& profile) {
   if (!profile.empty()) WriteFile(ProfileFile(), profile);
   // Another edition's, where the environment names one.
@@ -34,7 +38,7 @@ Json Stylus::Send(const std::string& line) {
     c = std::getc(m_program.output);
     if (c == EOF) throw std::runtime_error("no answer to: " + line + "\n" + Errors());
   }
-  return Json::parse(answer);
+  return ReadJson(answer);
 }
 
 platform::CBitmap Stylus::Shot() {

@@ -12,6 +12,10 @@ namespace feltside::tests {
 
 using Json = nlohmann::json;
 
+// Compiled once, as the library's parser and writer take their time under the sanitizers.
+Json ReadJson(const std::string& text);
+std::string ToText(const Json& value);
+
 /// The program as a player meets it: feltside-stylus as a process with a profile of its own.
 ///
 /// When it goes, it closes the program's input, and the test fails unless the program then ends
