@@ -28,6 +28,9 @@ TEST(HelpViewerTest, StartsTheDesktopsOpenerAndKnowsWhereItIsMissingOrFails) {
   // Trouble is told with the path of what is there, or should be.
   const std::string page = (folder.Path() / "help" / "page-topic.htm").string();
   EXPECT_NE(start("file:page.htm#topic").find(" " + page + "."), std::string::npos);
+  const auto beside = std::filesystem::read_symlink("/proc/self/exe").replace_filename("none");
+  EXPECT_NE(platform::StartHelpViewer({"none"}, "file:page.htm", 0).find(" " + beside.string()),
+            std::string::npos);
   WriteFile(opener, "#!/bin/sh\nexit 3\n");
   chmod(opener.c_str(), 0700);
   EXPECT_NE(start("file:page.htm#topic").find(" " + page + "."), std::string::npos);

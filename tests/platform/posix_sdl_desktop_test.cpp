@@ -6,6 +6,7 @@
 #include <gmock/gmock.h>
 
 #include <cstdlib>
+#include <utility>
 
 #include "platform/host/create_host.h"
 #include "platform/host/sdl_fonts.h"
@@ -152,6 +153,16 @@ TEST_F(SdlDesktopTest, ShowsThePictureWhetherOrNotTheDesktopTakesPlainPixels) {
       EXPECT_EQ(g_desktop.shown.At({0, 0}), 0xFF010203U);
       EXPECT_EQ(g_desktop.shown.At({24 * scale - 1, 30 * scale - 1}), 0xFF040506U);
     }
+    // It is not drawn again before what lay over it has gone.
+    const CBitmap before = std::exchange(g_desktop.shown, {});
+    HandleEvents();
+    EXPECT_EQ(g_desktop.shown, CBitmap());
+    SDL_Event raw{};
+    raw.type = SDL_WINDOWEVENT;
+    raw.window.event = SDL_WINDOWEVENT_EXPOSED;
+    SDL_PushEvent(&raw);
+    HandleEvents();
+    EXPECT_EQ(g_desktop.shown, before);
     m_pHost.reset();
   }
 }
