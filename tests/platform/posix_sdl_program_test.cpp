@@ -13,8 +13,8 @@ namespace feltside::tests {
 namespace {
 
 Child StartOn(const char* driver, const TemporaryFolder& folder) {
-  unsetenv(
-      "DISPLAY");  // or SDL looks for the desktop's bus, which loses memory where there is none
+  // Or SDL looks for the desktop's bus, which loses memory where there is none.
+  unsetenv("DISPLAY");
   setenv("SDL_VIDEODRIVER", driver, 1);
   const Child child = StartChild(FELTSIDE_PROGRAM, folder.Path());
   unsetenv("SDL_VIDEODRIVER");
