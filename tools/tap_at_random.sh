@@ -17,7 +17,8 @@ seed=${2:-1}
 game=$(readlink -f "${3:-build/play}")/feltside
 batch=100
 batches_a_start=50
-patience=30 # seconds until there must be a window
+ticks=$(getconf CLK_TCK) # in a second of a processor
+patience=60 # seconds until there must be a window, or an end
 
 [ -x "$game" ] || fail "there is no $game: build it first"
 for needed in Xvfb xdotool; do
@@ -58,12 +59,15 @@ start_game() {
   done
 }
 
-# catch_up: gives the game the time to work off what it was sent, until it sleeps or is left.
+# catch_up: gives the game the time to work off what it was sent, until it sleeps or is left. What counts
+# is its own time, as others may keep it from the processor.
 catch_up() {
-  local end=$((SECONDS + patience)) asleep=0 state
+  local asleep=0 began='' state user system
   while [ $asleep -lt 3 ]; do
-    [ $SECONDS -lt $end ] || fail "the game finds no end of $batch events after $sent"
-    state=$(cut -d ' ' -f 3 "/proc/$program_pid/stat" 2>/dev/null)
+    read -r state user system < <(cut -d ' ' -f 3,14,15 "/proc/$program_pid/stat" 2>/dev/null)
+    began=${began:-$((user + system))}
+    [ $((user + system - began)) -lt $((patience * ticks)) ] ||
+      fail "the game finds no end of $batch events after $sent"
     case $state in
       S) asleep=$((asleep + 1)) ;;
       R | D) asleep=0 ;;
