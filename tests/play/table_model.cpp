@@ -25,7 +25,8 @@ int Total(const Cards& cards) {
   return ace && hard <= 11 ? hard + 10 : hard;
 }
 
-/// What a hand of five different cards returns, by the shape of its ranks.
+/// What a hand of five cards returns, by the shape of its ranks. Cards that were stacked for the other
+/// game may be five of a rank, which are four and one more.
 int PokerReturn(const Cards& cards) {
   std::array<int, 15> count{};
   std::set<int> suits;
@@ -42,7 +43,7 @@ int PokerReturn(const Cards& cards) {
   }
   const auto has = [&count](int n) { return std::count(count.begin(), count.end() - 1, n); };
   if (straight && suits.size() == 1) return count[10] == 1 && count[1] == 1 ? 250 : 50;
-  if (has(4) == 1) return 20;
+  if (has(4) + has(5) == 1) return 20;
   if (has(3) == 1 && has(2) == 1) return 7;
   if (suits.size() == 1) return 5;
   if (straight) return 4;
