@@ -25,8 +25,8 @@ int Total(const Cards& cards) {
   return ace && hard <= 11 ? hard + 10 : hard;
 }
 
-/// What a hand of five cards returns, by the shape of its ranks. Cards that were stacked for the other
-/// game may be five of a rank, which are four and one more.
+/// What a hand of five cards returns, by the shape of its ranks. Cards that were stacked for the
+/// other game may be five of a rank, which are four and one more.
 int PokerReturn(const Cards& cards) {
   std::array<int, 15> count{};
   std::set<int> suits;
