@@ -62,13 +62,14 @@ start_game() {
 # catch_up: gives the game the time to work off what it was sent, until it sleeps or is left. What counts
 # is its own time, as others may keep it from the processor.
 catch_up() {
-  local asleep=0 began='' state user system
+  local asleep=0 began='' fields spent
   while [ $asleep -lt 3 ]; do
-    read -r state user system < <(cut -d ' ' -f 3,14,15 "/proc/$program_pid/stat" 2>/dev/null)
-    began=${began:-$((user + system))}
-    [ $((user + system - began)) -lt $((patience * ticks)) ] ||
+    { read -r -a fields <"/proc/$program_pid/stat"; } 2>/dev/null || return
+    spent=$((fields[13] + fields[14]))
+    began=${began:-$spent}
+    [ $((spent - began)) -lt $((patience * ticks)) ] ||
       fail "the game finds no end of $batch events after $sent"
-    case $state in
+    case ${fields[2]} in
       S) asleep=$((asleep + 1)) ;;
       R | D) asleep=0 ;;
       *) return ;;
