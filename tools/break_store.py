@@ -92,11 +92,11 @@ def was_told(answers):
 class Breaker:
     def __init__(self, build):
         self.game = build / "feltside-stylus"
-        self.library = build / "fuzz" / "libfailing-calls.so"
+        self.preloaded = build / "fuzz" / "libfailing-calls.so"
         self.outcomes = {}
 
     def environment(self, folder, faults):
-        failing = {"LD_PRELOAD": str(self.library), **PRELOADING} if faults else {}
+        failing = {"LD_PRELOAD": str(self.preloaded), **PRELOADING} if faults else {}
         return {**os.environ, "XDG_CONFIG_HOME": str(folder), **failing, **faults}
 
     def note(self, what, outcome, how=""):

@@ -1,5 +1,5 @@
 // The functions that the program calls: see web_page.h and web_storage.h.
-mergeInto(LibraryManager.library, {
+mergeInto(LibraryManager['library'], {
   $newText__deps: ['malloc'],
   $newText: function (text) {
     const size = lengthBytesUTF8(text) + 1;
