@@ -16,7 +16,7 @@ from pathlib import Path
 from scenes import ROOT, SCALE, indexed, open_stylus, read_scenes, save, take
 
 ALBUM = ROOT / "docs" / "album"
-# Taken by tests/web/take_pictures.py.
+# Taken by take_browser_pictures.py.
 BROWSER = {
     "desktop": "In a browser on a desktop.",
     "phone": "On a phone.",

@@ -1,8 +1,13 @@
 #!/usr/bin/env python3
-"""Takes the album's pictures of the page, to be looked at: take_pictures.py"""
+"""Takes the album's pictures of the page, to be looked at: tools/take_browser_pictures.py"""
 
-from page import FIXED_CLOCK, ROOT, Page, Server, open_browser
-from web_test import DEAL, EXIT, MENU, NATURAL, PLAIN, STAND
+import sys
+from pathlib import Path
+
+# The page is worked as its tests work it.
+sys.path.insert(0, str(Path(__file__).resolve().parent.parent / "tests" / "web"))
+from page import FIXED_CLOCK, ROOT, Page, Server, open_browser  # noqa: E402
+from web_test import DEAL, EXIT, MENU, NATURAL, PLAIN, STAND  # noqa: E402
 
 FOLDER = ROOT / "docs" / "album" / "browser"
 
